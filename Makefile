@@ -1,0 +1,53 @@
+# Thin wrapper over CMake. The README's quick start is `make demo` and `make test`.
+BUILD_DIR    ?= build
+SANITIZE_DIR ?= build-sanitize
+FUZZ_DIR     ?= build-fuzz
+PREFIX       ?= /usr/local
+JOBS         ?= 2
+FUZZ_SECONDS ?= 60
+CMAKE_ARGS   ?=
+
+DEXCHANGE := $(BUILD_DIR)/tools/dexchange/dexchange
+
+.PHONY: all deps configure build demo test sanitize install bench fuzz locale-test format tidy clean
+
+all: build
+
+deps:
+	@scripts/deps.sh
+
+$(BUILD_DIR)/CMakeCache.txt: | deps
+	cmake -S . -B $(BUILD_DIR) -DCMAKE_BUILD_TYPE=RelWithDebInfo $(CMAKE_ARGS)
+
+configure: $(BUILD_DIR)/CMakeCache.txt
+
+build: configure
+	cmake --build $(BUILD_DIR) -j$(JOBS)
+
+demo: build
+	scripts/demo.sh $(DEXCHANGE)
+
+test: build
+	ctest --test-dir $(BUILD_DIR) --output-on-failure -j$(JOBS)
+
+sanitize: deps
+	cmake -S . -B $(SANITIZE_DIR) -DCMAKE_BUILD_TYPE=Debug -DDEXCHANGE_SANITIZE=ON $(CMAKE_ARGS)
+	cmake --build $(SANITIZE_DIR) -j$(JOBS)
+	ASAN_OPTIONS=detect_leaks=1:abort_on_error=1 UBSAN_OPTIONS=print_stacktrace=1:halt_on_error=1 \
+		ctest --test-dir $(SANITIZE_DIR) --output-on-failure -j$(JOBS)
+
+install: build
+	cmake --install $(BUILD_DIR) --prefix $(PREFIX)
+
+bench: deps
+	cmake -S . -B $(BUILD_DIR) -DDEXCHANGE_BENCH=ON $(CMAKE_ARGS)
+	cmake --build $(BUILD_DIR) -j$(JOBS)
+
+format:
+	git ls-files '*.h' '*.cpp' | xargs clang-format -i
+
+tidy: configure
+	git ls-files 'src/*.cpp' 'tools/*.cpp' 'plugins/*.cpp' | xargs clang-tidy -p $(BUILD_DIR) --quiet
+
+clean:
+	rm -rf $(BUILD_DIR) $(SANITIZE_DIR) $(FUZZ_DIR)

@@ -1,0 +1,13 @@
+#include "Command.h"
+
+namespace dexchange_tool {
+
+std::unique_ptr<Command> makeVersionCommand();
+
+std::vector<std::unique_ptr<Command>> makeCommands() {
+  std::vector<std::unique_ptr<Command>> commands;
+  commands.push_back(makeVersionCommand());
+  return commands;
+}
+
+}  // namespace dexchange_tool
