@@ -27,7 +27,8 @@ bool isHyphenPosition(int index) {
 
 // Reads the 32 hexadecimal digits of a braced GUID text into 16 bytes, in text order.
 bool readDigits(const wchar_t* text, std::uint8_t (&bytes)[16]) {
-  if (std::wcslen(text) != kGuidTextLength || text[0] != L'{' || text[kGuidTextLength - 1] != L'}') return false;
+  if (std::wcslen(text) != kGuidTextLength || text[0] != L'{' || text[kGuidTextLength - 1] != L'}')
+    return false;
   int nibble = 0;
   for (int i = 1; i < kGuidTextLength - 1; ++i) {
     if (isHyphenPosition(i)) {
@@ -54,8 +55,8 @@ HRESULT CLSIDFromString(const wchar_t* text, CLSID* guid) {
   *guid = GUID{};
   std::uint8_t bytes[16] = {};
   if (text == nullptr || !readDigits(text, bytes)) return CO_E_CLASSSTRING;
-  guid->Data1 = (std::uint32_t{bytes[0]} << 24) | (std::uint32_t{bytes[1]} << 16) | (std::uint32_t{bytes[2]} << 8) |
-                bytes[3];
+  guid->Data1 = (std::uint32_t{bytes[0]} << 24) | (std::uint32_t{bytes[1]} << 16) |
+                (std::uint32_t{bytes[2]} << 8) | bytes[3];
   guid->Data2 = static_cast<std::uint16_t>((bytes[4] << 8) | bytes[5]);
   guid->Data3 = static_cast<std::uint16_t>((bytes[6] << 8) | bytes[7]);
   std::memcpy(guid->Data4, bytes + 8, sizeof guid->Data4);
@@ -65,9 +66,10 @@ HRESULT CLSIDFromString(const wchar_t* text, CLSID* guid) {
 int StringFromGUID2(const GUID& guid, wchar_t* buffer, int size) {
   if (buffer == nullptr || size < kGuidTextLength + 1) return 0;
   std::swprintf(buffer, static_cast<std::size_t>(size), L"{%08X-%04X-%04X-%02X%02X-%02X%02X%02X%02X%02X%02X}",
-                static_cast<unsigned>(guid.Data1), unsigned{guid.Data2}, unsigned{guid.Data3}, unsigned{guid.Data4[0]},
-                unsigned{guid.Data4[1]}, unsigned{guid.Data4[2]}, unsigned{guid.Data4[3]}, unsigned{guid.Data4[4]},
-                unsigned{guid.Data4[5]}, unsigned{guid.Data4[6]}, unsigned{guid.Data4[7]});
+                static_cast<unsigned>(guid.Data1), unsigned{guid.Data2}, unsigned{guid.Data3},
+                unsigned{guid.Data4[0]}, unsigned{guid.Data4[1]}, unsigned{guid.Data4[2]},
+                unsigned{guid.Data4[3]}, unsigned{guid.Data4[4]}, unsigned{guid.Data4[5]},
+                unsigned{guid.Data4[6]}, unsigned{guid.Data4[7]});
   return kGuidTextLength + 1;
 }
 
@@ -79,4 +81,6 @@ HRESULT StringFromCLSID(const CLSID& guid, wchar_t** text) {
   return S_OK;
 }
 
-void CoTaskMemFree(void* block) { std::free(block); }
+void CoTaskMemFree(void* block) {
+  std::free(block);
+}

@@ -13,11 +13,21 @@ DEX_API void* vyn_operator_new(std::size_t size) noexcept;
 
 // Class-level allocation through the host allocator. Put it in the class body; the base list stays as
 // it is. The allocation functions are noexcept, so a failed `new` yields null instead of throwing.
-#define VYN_CLASS_ALLOCATOR                                                                             \
- public:                                                                                               \
-  static void* operator new(std::size_t size) noexcept { return ::vyn_operator_new(size); }             \
-  static void* operator new[](std::size_t size) noexcept { return ::vyn_operator_new(size); }           \
-  static void* operator new(std::size_t, void* place) noexcept { return place; }                        \
-  static void operator delete(void* block) noexcept { std::free(block); }                              \
-  static void operator delete[](void* block) noexcept { std::free(block); }                            \
+#define VYN_CLASS_ALLOCATOR                                      \
+ public:                                                         \
+  static void* operator new(std::size_t size) noexcept {         \
+    return ::vyn_operator_new(size);                             \
+  }                                                              \
+  static void* operator new[](std::size_t size) noexcept {       \
+    return ::vyn_operator_new(size);                             \
+  }                                                              \
+  static void* operator new(std::size_t, void* place) noexcept { \
+    return place;                                                \
+  }                                                              \
+  static void operator delete(void* block) noexcept {            \
+    std::free(block);                                            \
+  }                                                              \
+  static void operator delete[](void* block) noexcept {          \
+    std::free(block);                                            \
+  }                                                              \
   static void operator delete(void*, void*) noexcept {}

@@ -19,7 +19,9 @@ std::wstring_view viewOf(const wchar_t* text) noexcept {
   return text == nullptr ? std::wstring_view() : std::wstring_view(text);
 }
 
-int toInt(std::size_t value) noexcept { return static_cast<int>(value); }
+int toInt(std::size_t value) noexcept {
+  return static_cast<int>(value);
+}
 
 // Clamps an index into [0, size].
 std::size_t clampIndex(int index, std::size_t size) noexcept {
@@ -27,7 +29,9 @@ std::size_t clampIndex(int index, std::size_t size) noexcept {
   return std::min(static_cast<std::size_t>(index), size);
 }
 
-wchar_t foldCase(wchar_t ch) noexcept { return static_cast<wchar_t>(towlower_l(ch, detail::numericLocale())); }
+wchar_t foldCase(wchar_t ch) noexcept {
+  return static_cast<wchar_t>(towlower_l(ch, detail::numericLocale()));
+}
 
 int compareFolded(std::wstring_view a, std::wstring_view b) noexcept {
   const std::size_t common = std::min(a.size(), b.size());
@@ -117,21 +121,36 @@ String& String::operator+=(wchar_t ch) {
   return *this;
 }
 
-int String::GetLength() const noexcept { return toInt(text_.size()); }
-bool String::IsEmpty() const noexcept { return text_.empty(); }
-void String::Empty() noexcept { text_.clear(); }
+int String::GetLength() const noexcept {
+  return toInt(text_.size());
+}
+bool String::IsEmpty() const noexcept {
+  return text_.empty();
+}
+void String::Empty() noexcept {
+  text_.clear();
+}
 
 wchar_t String::GetAt(int index) const noexcept {
   return index >= 0 && static_cast<std::size_t>(index) < text_.size() ? text_[static_cast<std::size_t>(index)]
-                                                                        : L'\0';
+                                                                      : L'\0';
 }
-wchar_t String::operator[](int index) const noexcept { return GetAt(index); }
+wchar_t String::operator[](int index) const noexcept {
+  return GetAt(index);
+}
 void String::SetAt(int index, wchar_t ch) noexcept {
-  if (index >= 0 && static_cast<std::size_t>(index) < text_.size()) text_[static_cast<std::size_t>(index)] = ch;
+  if (index >= 0 && static_cast<std::size_t>(index) < text_.size())
+    text_[static_cast<std::size_t>(index)] = ch;
 }
-const wchar_t* String::GetString() const noexcept { return text_.c_str(); }
-String::operator const wchar_t*() const noexcept { return text_.c_str(); }
-std::wstring_view String::view() const noexcept { return text_; }
+const wchar_t* String::GetString() const noexcept {
+  return text_.c_str();
+}
+String::operator const wchar_t*() const noexcept {
+  return text_.c_str();
+}
+std::wstring_view String::view() const noexcept {
+  return text_;
+}
 
 wchar_t* String::GetBuffer(int minLength) {
   if (minLength > 0 && static_cast<std::size_t>(minLength) > text_.size()) {
@@ -148,7 +167,9 @@ int String::Compare(const wchar_t* text) const noexcept {
   const int order = view().compare(viewOf(text));
   return order < 0 ? -1 : (order > 0 ? 1 : 0);
 }
-int String::CompareNoCase(const wchar_t* text) const noexcept { return compareFolded(view(), viewOf(text)); }
+int String::CompareNoCase(const wchar_t* text) const noexcept {
+  return compareFolded(view(), viewOf(text));
+}
 
 int String::Insert(int index, wchar_t ch) {
   text_.insert(clampIndex(index, text_.size()), 1, ch);
@@ -186,7 +207,8 @@ int String::Replace(const wchar_t* oldText, const wchar_t* newText) {
   int changes = 0;
   std::wstring result;
   std::size_t position = 0;
-  for (std::size_t found = text_.find(from); found != std::wstring::npos; found = text_.find(from, position)) {
+  for (std::size_t found = text_.find(from); found != std::wstring::npos;
+       found = text_.find(from, position)) {
     result.append(text_, position, found - position);
     result += to;
     position = found + from.size();
@@ -220,13 +242,17 @@ int String::ReverseFind(wchar_t ch) const noexcept {
   return found == std::wstring::npos ? -1 : toInt(found);
 }
 
-String String::Mid(int first) const { return Mid(first, GetLength()); }
+String String::Mid(int first) const {
+  return Mid(first, GetLength());
+}
 String String::Mid(int first, int count) const {
   const std::size_t begin = clampIndex(first, text_.size());
   if (count <= 0) return {};
   return String(view().substr(begin, static_cast<std::size_t>(count)));
 }
-String String::Left(int count) const { return count <= 0 ? String() : String(view().substr(0, clampIndex(count, text_.size()))); }
+String String::Left(int count) const {
+  return count <= 0 ? String() : String(view().substr(0, clampIndex(count, text_.size())));
+}
 String String::Right(int count) const {
   const std::size_t length = clampIndex(count, text_.size());
   return String(view().substr(text_.size() - length));
@@ -260,9 +286,15 @@ String String::Tokenize(const wchar_t* delimiters, int& start) const {
   return String(text.substr(begin, end - begin));
 }
 
-String& String::Trim() { return TrimRight().TrimLeft(); }
-String& String::Trim(wchar_t target) { return TrimRight(target).TrimLeft(target); }
-String& String::Trim(const wchar_t* targets) { return TrimRight(targets).TrimLeft(targets); }
+String& String::Trim() {
+  return TrimRight().TrimLeft();
+}
+String& String::Trim(wchar_t target) {
+  return TrimRight(target).TrimLeft(target);
+}
+String& String::Trim(const wchar_t* targets) {
+  return TrimRight(targets).TrimLeft(targets);
+}
 String& String::TrimLeft() {
   text_.erase(0, firstNotOf(text_, kWhiteSpace));
   return *this;
@@ -290,11 +322,13 @@ String& String::TrimRight(const wchar_t* targets) {
   return *this;
 }
 String& String::MakeUpper() {
-  for (wchar_t& ch : text_) ch = static_cast<wchar_t>(towupper_l(ch, detail::numericLocale()));
+  for (wchar_t& ch : text_)
+    ch = static_cast<wchar_t>(towupper_l(ch, detail::numericLocale()));
   return *this;
 }
 String& String::MakeLower() {
-  for (wchar_t& ch : text_) ch = foldCase(ch);
+  for (wchar_t& ch : text_)
+    ch = foldCase(ch);
   return *this;
 }
 String& String::MakeReverse() {
@@ -350,7 +384,11 @@ String operator+(wchar_t left, const String& right) {
   return result;
 }
 
-std::string toUtf8(const wchar_t* text) { return detail::toUtf8(viewOf(text)); }
-std::string toUtf8(std::wstring_view text) { return detail::toUtf8(text); }
+std::string toUtf8(const wchar_t* text) {
+  return detail::toUtf8(viewOf(text));
+}
+std::string toUtf8(std::wstring_view text) {
+  return detail::toUtf8(text);
+}
 
 }  // namespace vyn_text

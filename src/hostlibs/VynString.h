@@ -59,11 +59,11 @@ class DEX_API CVynStringT<wchar_t> {
   int GetLength() const noexcept;
   bool IsEmpty() const noexcept;
   void Empty() noexcept;
-  wchar_t GetAt(int index) const noexcept;         // 0 outside the text
-  wchar_t operator[](int index) const noexcept;    // as GetAt
-  void SetAt(int index, wchar_t ch) noexcept;      // ignored outside the text
-  const wchar_t* GetString() const noexcept;       // never null
-  operator const wchar_t*() const noexcept;        // NOLINT(google-explicit-constructor)
+  wchar_t GetAt(int index) const noexcept;       // 0 outside the text
+  wchar_t operator[](int index) const noexcept;  // as GetAt
+  void SetAt(int index, wchar_t ch) noexcept;    // ignored outside the text
+  const wchar_t* GetString() const noexcept;     // never null
+  operator const wchar_t*() const noexcept;      // NOLINT(google-explicit-constructor)
   std::wstring_view view() const noexcept;
   // Direct access for C-style writers: at least minLength characters (plus a terminator) are
   // writable; ReleaseBuffer(-1) then takes the length up to the first zero.
@@ -134,25 +134,57 @@ DEX_API CVynStringT<wchar_t> operator+(wchar_t left, const CVynStringT<wchar_t>&
 inline bool operator==(const CVynStringT<wchar_t>& a, const CVynStringT<wchar_t>& b) noexcept {
   return a.view() == b.view();
 }
-inline bool operator==(const CVynStringT<wchar_t>& a, const wchar_t* b) noexcept { return a.Compare(b) == 0; }
-inline bool operator==(const wchar_t* a, const CVynStringT<wchar_t>& b) noexcept { return b.Compare(a) == 0; }
-inline bool operator!=(const CVynStringT<wchar_t>& a, const CVynStringT<wchar_t>& b) noexcept { return !(a == b); }
-inline bool operator!=(const CVynStringT<wchar_t>& a, const wchar_t* b) noexcept { return !(a == b); }
-inline bool operator!=(const wchar_t* a, const CVynStringT<wchar_t>& b) noexcept { return !(b == a); }
+inline bool operator==(const CVynStringT<wchar_t>& a, const wchar_t* b) noexcept {
+  return a.Compare(b) == 0;
+}
+inline bool operator==(const wchar_t* a, const CVynStringT<wchar_t>& b) noexcept {
+  return b.Compare(a) == 0;
+}
+inline bool operator!=(const CVynStringT<wchar_t>& a, const CVynStringT<wchar_t>& b) noexcept {
+  return !(a == b);
+}
+inline bool operator!=(const CVynStringT<wchar_t>& a, const wchar_t* b) noexcept {
+  return !(a == b);
+}
+inline bool operator!=(const wchar_t* a, const CVynStringT<wchar_t>& b) noexcept {
+  return !(b == a);
+}
 inline bool operator<(const CVynStringT<wchar_t>& a, const CVynStringT<wchar_t>& b) noexcept {
   return a.view() < b.view();
 }
-inline bool operator<(const CVynStringT<wchar_t>& a, const wchar_t* b) noexcept { return a.Compare(b) < 0; }
-inline bool operator<(const wchar_t* a, const CVynStringT<wchar_t>& b) noexcept { return b.Compare(a) > 0; }
-inline bool operator>(const CVynStringT<wchar_t>& a, const CVynStringT<wchar_t>& b) noexcept { return b < a; }
-inline bool operator>(const CVynStringT<wchar_t>& a, const wchar_t* b) noexcept { return a.Compare(b) > 0; }
-inline bool operator>(const wchar_t* a, const CVynStringT<wchar_t>& b) noexcept { return b.Compare(a) < 0; }
-inline bool operator<=(const CVynStringT<wchar_t>& a, const CVynStringT<wchar_t>& b) noexcept { return !(b < a); }
-inline bool operator<=(const CVynStringT<wchar_t>& a, const wchar_t* b) noexcept { return a.Compare(b) <= 0; }
-inline bool operator<=(const wchar_t* a, const CVynStringT<wchar_t>& b) noexcept { return b.Compare(a) >= 0; }
-inline bool operator>=(const CVynStringT<wchar_t>& a, const CVynStringT<wchar_t>& b) noexcept { return !(a < b); }
-inline bool operator>=(const CVynStringT<wchar_t>& a, const wchar_t* b) noexcept { return a.Compare(b) >= 0; }
-inline bool operator>=(const wchar_t* a, const CVynStringT<wchar_t>& b) noexcept { return b.Compare(a) <= 0; }
+inline bool operator<(const CVynStringT<wchar_t>& a, const wchar_t* b) noexcept {
+  return a.Compare(b) < 0;
+}
+inline bool operator<(const wchar_t* a, const CVynStringT<wchar_t>& b) noexcept {
+  return b.Compare(a) > 0;
+}
+inline bool operator>(const CVynStringT<wchar_t>& a, const CVynStringT<wchar_t>& b) noexcept {
+  return b < a;
+}
+inline bool operator>(const CVynStringT<wchar_t>& a, const wchar_t* b) noexcept {
+  return a.Compare(b) > 0;
+}
+inline bool operator>(const wchar_t* a, const CVynStringT<wchar_t>& b) noexcept {
+  return b.Compare(a) < 0;
+}
+inline bool operator<=(const CVynStringT<wchar_t>& a, const CVynStringT<wchar_t>& b) noexcept {
+  return !(b < a);
+}
+inline bool operator<=(const CVynStringT<wchar_t>& a, const wchar_t* b) noexcept {
+  return a.Compare(b) <= 0;
+}
+inline bool operator<=(const wchar_t* a, const CVynStringT<wchar_t>& b) noexcept {
+  return b.Compare(a) >= 0;
+}
+inline bool operator>=(const CVynStringT<wchar_t>& a, const CVynStringT<wchar_t>& b) noexcept {
+  return !(a < b);
+}
+inline bool operator>=(const CVynStringT<wchar_t>& a, const wchar_t* b) noexcept {
+  return a.Compare(b) >= 0;
+}
+inline bool operator>=(const wchar_t* a, const CVynStringT<wchar_t>& b) noexcept {
+  return b.Compare(a) <= 0;
+}
 
 // UTF-8 form of a wide text (a null pointer gives ""); lone surrogates become U+FFFD.
 DEX_API std::string toUtf8(const wchar_t* text);

@@ -60,8 +60,12 @@ struct GUID {
 using CLSID = GUID;
 
 DEX_API bool operator==(const GUID& a, const GUID& b) noexcept;
-inline bool operator!=(const GUID& a, const GUID& b) noexcept { return !(a == b); }
-inline bool IsEqualGUID(const GUID& a, const GUID& b) noexcept { return a == b; }
+inline bool operator!=(const GUID& a, const GUID& b) noexcept {
+  return !(a == b);
+}
+inline bool IsEqualGUID(const GUID& a, const GUID& b) noexcept {
+  return a == b;
+}
 
 // 100-nanosecond intervals since 1601-01-01 UTC.
 struct FILETIME {

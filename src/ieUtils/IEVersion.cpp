@@ -2,6 +2,8 @@
 
 namespace vyn::ie {
 
-const char* getLibraryVersionString() noexcept { return DEXCHANGE_VERSION_STRING; }
+const char* getLibraryVersionString() noexcept {
+  return DEXCHANGE_VERSION_STRING;
+}
 
 }  // namespace vyn::ie

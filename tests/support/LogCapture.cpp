@@ -9,7 +9,9 @@ LogCapture::LogCapture() {
   });
 }
 
-LogCapture::~LogCapture() { vyn_logging::setLogSink({}); }
+LogCapture::~LogCapture() {
+  vyn_logging::setLogSink({});
+}
 
 std::vector<vyn_logging::LogRecord> LogCapture::records() const {
   const std::lock_guard<std::mutex> lock(mutex_);

@@ -21,9 +21,15 @@ TempDir::~TempDir() {
   std::filesystem::remove_all(path_, ignored);
 }
 
-std::wstring TempDir::wpath() const { return widen(path_); }
-std::string TempDir::file(std::string_view name) const { return path_ + "/" + std::string(name); }
-std::wstring TempDir::wfile(std::string_view name) const { return widen(file(name)); }
+std::wstring TempDir::wpath() const {
+  return widen(path_);
+}
+std::string TempDir::file(std::string_view name) const {
+  return path_ + "/" + std::string(name);
+}
+std::wstring TempDir::wfile(std::string_view name) const {
+  return widen(file(name));
+}
 
 std::string TempDir::write(std::string_view name, std::string_view bytes) const {
   const std::string target = file(name);
@@ -41,8 +47,12 @@ std::wstring widen(std::string_view utf8) {
   return std::wstring(CVynStringT<wchar_t>(std::string(utf8).c_str(), vyn_text::CP_UTF8).view());
 }
 
-std::string narrow(std::wstring_view wide) { return vyn_text::toUtf8(wide); }
+std::string narrow(std::wstring_view wide) {
+  return vyn_text::toUtf8(wide);
+}
 
-std::string dataFile(std::string_view relative) { return std::string(DEXCHANGE_TEST_DATA_DIR) + "/" + std::string(relative); }
+std::string dataFile(std::string_view relative) {
+  return std::string(DEXCHANGE_TEST_DATA_DIR) + "/" + std::string(relative);
+}
 
 }  // namespace dex_test

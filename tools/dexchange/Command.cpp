@@ -2,7 +2,8 @@
 
 namespace dexchange_tool {
 
-std::optional<Arguments> Arguments::parse(const std::vector<std::string>& words, const std::set<std::string>& flags,
+std::optional<Arguments> Arguments::parse(const std::vector<std::string>& words,
+                                          const std::set<std::string>& flags,
                                           const std::set<std::string>& valued, std::string& error) {
   Arguments parsed;
   bool optionsEnded = false;

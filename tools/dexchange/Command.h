@@ -25,7 +25,8 @@ struct ToolStreams {
 class Arguments {
  public:
   // Parses words; on a word the command does not know, returns nullopt and sets error.
-  static std::optional<Arguments> parse(const std::vector<std::string>& words, const std::set<std::string>& flags,
+  static std::optional<Arguments> parse(const std::vector<std::string>& words,
+                                        const std::set<std::string>& flags,
                                         const std::set<std::string>& valued, std::string& error);
 
   bool has(const std::string& name) const { return flags_.count(name) > 0 || values_.count(name) > 0; }

@@ -16,9 +16,11 @@ std::string overview(const std::vector<std::unique_ptr<Command>>& commands) {
       "\n"
       "commands:\n";
   std::size_t width = 0;
-  for (const auto& command : commands) width = std::max(width, command->name().size());
+  for (const auto& command : commands)
+    width = std::max(width, command->name().size());
   for (const auto& command : commands) {
-    text += "  " + command->name() + std::string(width + 2 - command->name().size(), ' ') + command->summary() + "\n";
+    text += "  " + command->name() + std::string(width + 2 - command->name().size(), ' ') +
+            command->summary() + "\n";
   }
   return text;
 }

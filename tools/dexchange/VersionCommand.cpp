@@ -24,6 +24,8 @@ class VersionCommand final : public Command {
 
 }  // namespace
 
-std::unique_ptr<Command> makeVersionCommand() { return std::make_unique<VersionCommand>(); }
+std::unique_ptr<Command> makeVersionCommand() {
+  return std::make_unique<VersionCommand>();
+}
 
 }  // namespace dexchange_tool

@@ -97,7 +97,8 @@ void appendUtf8(std::string& out, wchar_t ch) {
 std::string toUtf8(std::wstring_view text) {
   std::string out;
   out.reserve(text.size());
-  for (const wchar_t ch : text) appendUtf8(out, ch);
+  for (const wchar_t ch : text)
+    appendUtf8(out, ch);
   return out;
 }
 

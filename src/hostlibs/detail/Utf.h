@@ -29,6 +29,8 @@ std::u16string toUtf16(std::wstring_view text);
 std::wstring fromUtf16(std::u16string_view units);
 
 // True when ch is a code point that UTF-8/UTF-16 can carry (no surrogate, at most U+10FFFF).
-constexpr bool isScalarValue(char32_t ch) { return ch < 0xD800 || (ch > 0xDFFF && ch <= 0x10FFFF); }
+constexpr bool isScalarValue(char32_t ch) {
+  return ch < 0xD800 || (ch > 0xDFFF && ch <= 0x10FFFF);
+}
 
 }  // namespace vyn_text::detail

@@ -1,0 +1,58 @@
+#include <gtest/gtest.h>
+
+#include <array>
+#include <cstdio>
+#include <string>
+
+namespace {
+
+struct ToolRun {
+  int exitCode = -1;
+  std::string output;  // stdout and stderr together
+};
+
+ToolRun runTool(const std::string& arguments) {
+  ToolRun run;
+  const std::string command = std::string(DEXCHANGE_TOOL_PATH) + " " + arguments + " 2>&1";
+  FILE* pipe = ::popen(command.c_str(), "r");
+  if (pipe == nullptr) return run;
+  std::array<char, 512> chunk{};
+  while (std::fgets(chunk.data(), chunk.size(), pipe) != nullptr)
+    run.output += chunk.data();
+  const int status = ::pclose(pipe);
+  run.exitCode = WIFEXITED(status) ? WEXITSTATUS(status) : -1;
+  return run;
+}
+
+}  // namespace
+
+TEST(Tool, PrintsVersionAndHelp) {
+  const ToolRun version = runTool("--version");
+  EXPECT_EQ(0, version.exitCode);
+  EXPECT_EQ(0u, version.output.rfind("dexchange ", 0));
+
+  const ToolRun help = runTool("--help");
+  EXPECT_EQ(0, help.exitCode);
+  EXPECT_NE(std::string::npos, help.output.find("usage: dexchange"));
+  EXPECT_NE(std::string::npos, help.output.find("version"));
+
+  const ToolRun commandHelp = runTool("version --help");
+  EXPECT_EQ(0, commandHelp.exitCode);
+  EXPECT_NE(std::string::npos, commandHelp.output.find("usage: dexchange version"));
+}
+
+TEST(Tool, WrongCommandLinesFailWithOneLine) {
+  const ToolRun none = runTool("");
+  EXPECT_EQ(2, none.exitCode);
+
+  const ToolRun unknown = runTool("frobnicate");
+  EXPECT_EQ(2, unknown.exitCode);
+  EXPECT_EQ("dexchange: unknown command frobnicate (see dexchange --help)\n", unknown.output);
+
+  const ToolRun badOption = runTool("version --bogus");
+  EXPECT_EQ(2, badOption.exitCode);
+  EXPECT_EQ("dexchange: version: unknown option --bogus\n", badOption.output);
+
+  const ToolRun extra = runTool("version extra");
+  EXPECT_EQ(2, extra.exitCode);
+}
