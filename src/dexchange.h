@@ -8,4 +8,5 @@
 #include "hostlibs/VynLogging.h"
 #include "hostlibs/VynString.h"
 #include "hostlibs/winport.h"
+#include "ieDefinitions/IEResult.h"
 #include "ieUtils/IEVersion.h"
