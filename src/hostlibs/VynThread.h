@@ -24,6 +24,10 @@ using ThreadFunction = unsigned (*)(void* argument);
 // Returns INVALID_HANDLE_VALUE when the thread cannot be started (a null function included), after
 // writing one error-log record with sourceFile and line.
 //
+// The exit code reads STILL_ACTIVE (259) until the function returns (so a function should not return
+// 259 itself). An exception that leaves the function ends the thread with the exit code 0xFFFFFFFF and
+// one error-log record with sourceFile and line; it never reaches the process.
+//
 // Closing the handle of a thread that was started suspended and never resumed releases the thread: it
 // runs its function and ends normally, so that a function owning its argument still frees it and no
 // thread stays blocked for ever.
