@@ -2,19 +2,15 @@
 
 #include <atomic>
 
-#include "hostlibs/VynLogging.h"
 #include "hostlibs/winport.h"
 
 namespace vyn_ui {
 namespace {
 
-// Without a user to ask, the safe answer is no; the trace tells a reader of the log what was declined.
+// Without a user to ask, the safe answer is no: nothing is overwritten unattended.
 class DefaultMsgUi final : public IMsgUi {
  public:
-  int question(const wchar_t* text, unsigned /*flags*/) override {
-    VYN_TRACE_ALWAYS(L"question answered no: %ls", text != nullptr ? text : L"");
-    return IDNO;
-  }
+  int question(const wchar_t* /*text*/, unsigned /*flags*/) override { return IDNO; }
 };
 
 constinit DefaultMsgUi defaultUi;

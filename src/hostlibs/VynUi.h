@@ -16,7 +16,7 @@ class DEX_API IMsgUi {
 };
 
 // The process-wide service: the one installed by setMsgUi, or the default, which answers IDNO to
-// every question (so nothing is overwritten without a yes) and leaves a trace record with the question.
+// every question, so nothing is overwritten without a yes.
 DEX_API IMsgUi& msg_ui();
 
 // Installs the host's service; it is not owned and must outlive its use (including questions already
