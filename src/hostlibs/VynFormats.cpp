@@ -164,10 +164,11 @@ std::optional<double> fromSeparatedFields(std::wstring_view text, bool colons) {
     fields.push_back(text.substr(0, length));
     if (separator == text.end()) break;
     text.remove_prefix(length + 1);
-    if (!colons)
+    if (!colons) {
       text = trimmed(text);
-    else if (text.empty())
+    } else if (text.empty()) {
       fields.emplace_back();  // a trailing colon leaves an empty field
+    }
   }
   if (fields.size() < 2) return std::nullopt;
   return fromFields(fields);
