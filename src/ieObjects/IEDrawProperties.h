@@ -139,7 +139,8 @@ class DEX_API DexDrawPointProperties : public IDexDrawProperties {
   void setMarkStyle(EMarkStyleType style) { markStyle_.set(style); }
   bool isMarkStyleByLayer() const noexcept { return markStyle_.isByLayer(); }
   void setMarkStyleByLayer() noexcept { markStyle_.setByLayer(); }
-  // False when the mark style is not defined; otherwise its text and true.
+  // False when the mark style is not defined; otherwise its text (empty, and logged, for a value
+  // outside the table) and true.
   bool getMarkStyleAsString(CVynStringT<wchar_t>& text) const;
   // On a text of the table (any case) sets the style and returns true; otherwise the style becomes
   // undefined and the result is false.
@@ -186,7 +187,8 @@ class DEX_API DexDrawLineProperties : public IDexDrawProperties {
   void setDashStyle(EDashStyleType style) { dashStyle_.set(style); }
   bool isDashStyleByLayer() const noexcept { return dashStyle_.isByLayer(); }
   void setDashStyleByLayer() noexcept { dashStyle_.setByLayer(); }
-  // False when the dash style is not defined; otherwise its text and true.
+  // False when the dash style is not defined; otherwise its text (empty, and logged, for a value
+  // outside the table) and true.
   bool getDashStyleTypeAsString(CVynStringT<wchar_t>& text) const;
   // On a text of the table (any case) sets the style and returns true; otherwise the style becomes
   // undefined and the result is false.
@@ -239,7 +241,8 @@ class DEX_API DexDrawAreaProperties : public IDexDrawProperties {
   void setFillStyleType(EFillStyleType style) { fillStyle_.set(style); }
   bool isFillStyleByLayer() const noexcept { return fillStyle_.isByLayer(); }
   void setFillStyleByLayer() noexcept { fillStyle_.setByLayer(); }
-  // False when the fill style is not defined; otherwise its text and true.
+  // False when the fill style is not defined; otherwise its text (empty, and logged, for a value
+  // outside the table) and true.
   bool getFillStyleTypeAsString(CVynStringT<wchar_t>& text) const;
   // On a text of the table (any case) sets the style and returns true; otherwise the style becomes
   // undefined and the result is false.
