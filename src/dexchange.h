@@ -3,6 +3,9 @@
 // Umbrella header of libdexchange: every public header.
 
 #include "hostlibs/DexApi.h"
+#include "hostlibs/File.h"
+#include "hostlibs/FileFuncs.h"
+#include "hostlibs/TextFile.h"
 #include "hostlibs/VynAlloc.h"
 #include "hostlibs/VynArray.h"
 #include "hostlibs/VynFormats.h"
@@ -12,6 +15,7 @@
 #include "hostlibs/VynThread.h"
 #include "hostlibs/VynTime.h"
 #include "hostlibs/VynUi.h"
+#include "hostlibs/XmlParser.h"
 #include "hostlibs/vynmath.h"
 #include "hostlibs/winport.h"
 #include "ieDefinitions/IEResult.h"
