@@ -5,6 +5,7 @@
 #include <string>
 #include <utility>
 
+#include "support/OpenFiles.h"
 #include "support/TempDir.h"
 
 namespace {
@@ -121,6 +122,21 @@ TEST(CFile, HandsItsFileOverWhenMoved) {
   ASSERT_TRUE(writeText(third, "two"));
   EXPECT_TRUE(third.Close());
   EXPECT_EQ(dex_test::readFile(dir.file("moved.txt")), "onetwo");
+}
+
+TEST(CFile, ClosesItsFileWhenReopenedClosedOrDestroyed) {
+  const dex_test::TempDir dir;
+  const int before = dex_test::openFileDescriptors();
+  {
+    base::CFile file;
+    file.OpenForWriting(dir.wfile("a.txt").c_str());
+    file.OpenForAppending(dir.wfile("a.txt").c_str());
+    file.OpenForReading(dir.wfile("missing.txt").c_str());
+    EXPECT_EQ(dex_test::openFileDescriptors(), before);
+    file.OpenForReading(dir.wfile("a.txt").c_str());
+    EXPECT_EQ(dex_test::openFileDescriptors(), before + 1);
+  }
+  EXPECT_EQ(dex_test::openFileDescriptors(), before);
 }
 
 TEST(CFile, OpensNamesWithNonAsciiCharacters) {

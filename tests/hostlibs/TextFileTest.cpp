@@ -5,6 +5,7 @@
 #include <string>
 #include <vector>
 
+#include "support/OpenFiles.h"
 #include "support/TempDir.h"
 
 namespace {
@@ -178,6 +179,21 @@ TEST(CTextFile, StartsAgainWhenOpenedAgainAndStopsWhenClosed) {
   EXPECT_FALSE(file.IsOpen());
   EXPECT_FALSE(file.ReadString(line));
   EXPECT_EQ(file.GetEncoding(), Encoding::Utf8);
+}
+
+TEST(CTextFile, ClosesItsFileWhenReopenedClosedOrDestroyed) {
+  const std::wstring path = dex_test::widen(textFixture("mixed_line_ends.txt"));
+  const int before = dex_test::openFileDescriptors();
+  {
+    CTextFile file;
+    file.Open(path.c_str());
+    file.Open(path.c_str());
+    EXPECT_EQ(dex_test::openFileDescriptors(), before + 1);
+    file.Close();
+    EXPECT_EQ(dex_test::openFileDescriptors(), before);
+    file.Open(path.c_str());
+  }
+  EXPECT_EQ(dex_test::openFileDescriptors(), before);
 }
 
 TEST(CTextFile, TakesNonsenseBufferSizesAsTheSmallestBlock) {

@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "hostlibs/File.h"
+#include "support/OpenFiles.h"
 #include "support/PrintString.h"
 #include "support/TempDir.h"
 
@@ -288,6 +289,22 @@ TEST(CXmlParser, CopiesShareNothingWithTheirOriginal) {
   target = copy;
   EXPECT_FALSE(target.IsOpen());
   EXPECT_EQ(target.GetTextFile(), &textFile);
+}
+
+TEST(CXmlParser, ClosesItsFileOnEveryPath) {
+  const int before = dex_test::openFileDescriptors();
+  for (const char* name :
+       {"job_utf8.xml", "empty.xml", "not_xml.txt", "malformed_near_start.xml", "missing.xml"}) {
+    CXmlParser parser;
+    initialize(xmlFixture(name), parser);
+    CXmlParser halfRead;
+    if (initialize(xmlFixture(name), halfRead) == CXmlParserBase::INIT_OK) readAll(halfRead, 3);
+  }
+  CXmlParser reopened;
+  for (int i = 0; i < 3; ++i)
+    initialize(xmlFixture("job_utf8.xml"), reopened);
+  reopened.Close();
+  EXPECT_EQ(dex_test::openFileDescriptors(), before);
 }
 
 // --- Safety
