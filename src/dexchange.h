@@ -25,4 +25,5 @@
 #include "ieObjects/IEOwningList.h"
 #include "ieObjects/IEPhotoNotes.h"
 #include "ieObjects/IETypedValues.h"
+#include "ieUtils/IEFileReaders.h"
 #include "ieUtils/IEVersion.h"
