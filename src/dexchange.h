@@ -15,4 +15,7 @@
 #include "hostlibs/vynmath.h"
 #include "hostlibs/winport.h"
 #include "ieDefinitions/IEResult.h"
+#include "ieUtils/IEUtilsCoords.h"
+#include "ieUtils/IEUtilsUnitWords.h"
+#include "ieUtils/IEUtilsUnits.h"
 #include "ieUtils/IEVersion.h"
