@@ -12,7 +12,7 @@ namespace vyn::ie {
 
 // The text form of a geographic coordinate. The default precision is the one a precision of -1
 // selects; the example is 12.5 degrees written with it.
-enum class ECoordsStyle : std::int32_t {
+enum ECoordsStyle : std::int32_t {
   DECIMAL_DEGREES = 0,      // 12.500000000000 (12 decimals)
   PACKED_DMS = 1,           // DDD.MMSSsss: 12.300000000000 (12 decimals of the packed value)
   DMS_DIGITS = 2,           // DDDMMSS.sss: 123000.00000 (9 decimals of the packed value)
@@ -23,7 +23,7 @@ enum class ECoordsStyle : std::int32_t {
 };
 
 // The sign of DMS_WITH_MARKS.
-enum class ECoordsSign : std::int32_t {
+enum ECoordsSign : std::int32_t {
   SIGNED_NUMBER = 0,     // a minus sign for negative values, no letter
   LATITUDE_LETTER = 1,   // N for 0 and above, S below 0; the number is unsigned
   LONGITUDE_LETTER = 2,  // E for 0 and above, W below 0; the number is unsigned

@@ -21,8 +21,10 @@ namespace vyn::ie {
 inline constexpr double kNoValue = std::numeric_limits<double>::max();
 
 // Distance units. Values are stored and compared by number (formats registry, job history); a value
-// cast from any other number is accepted everywhere and converts nothing.
-enum class EDistUnits : std::int32_t {
+// cast from any other number is accepted everywhere and converts nothing. The unit enumerations are
+// unscoped so that they compare with plain numbers; name them qualified (EDistUnits::MILS) where a
+// name is shared with the angle units.
+enum EDistUnits : std::int32_t {
   METERS = 0,
   USFEET = 1,        // US survey foot, 1200/3937 m
   IFEET = 2,         // international foot, 0.3048 m
@@ -53,8 +55,10 @@ enum class EDistUnits : std::int32_t {
   ANY_UNITS = 27,  // a format that accepts every unit; converts nothing
 };
 
-// Angle units.
-enum class EAngleUnits : std::int32_t {
+// Angle units. They live in a namespace of their own because MILS and ANY_UNITS are also distance
+// units; the type and the names it does not share are brought into vyn::ie.
+namespace angle_units {
+enum EAngleUnits : std::int32_t {
   RADIANS = 0,
   GRADS_GONS = 1,
   MILS = 2,       // 6400 to a turn
@@ -62,13 +66,19 @@ enum class EAngleUnits : std::int32_t {
   DDDMMSSS = 4,   // packed degrees, minutes and seconds DDD.MMSSsss
   ANY_UNITS = 5,  // converts nothing
 };
+}  // namespace angle_units
+using angle_units::DDDMMSSS;
+using angle_units::DECDEG;
+using angle_units::EAngleUnits;
+using angle_units::GRADS_GONS;
+using angle_units::RADIANS;
 
-enum class ETemperatureUnits : std::int32_t {
+enum ETemperatureUnits : std::int32_t {
   FAHRENHEIT = 0,
   CELSIUS = 1,
 };
 
-enum class EPressureUnits : std::int32_t {
+enum EPressureUnits : std::int32_t {
   MMHG = 0,
   HPA = 1,
   INHG = 2,
@@ -80,7 +90,7 @@ enum class EPressureUnits : std::int32_t {
 namespace vyn::ie::utils {
 
 // The verdict of the text readers whose names end in Ex.
-enum class EFlagFltValues : std::int32_t {
+enum EFlagFltValues : std::int32_t {
   NOT_A_NUMBER = 0,  // the text is not a valid number; the result is 0.0
   EMPTY_TEXT = 1,    // the text is empty (no characters at all); the result is 0.0
   VALID_NUMBER = 2,  // a number was read
