@@ -21,4 +21,5 @@
 #include "ieObjects/IEOwningList.h"
 #include "ieObjects/IEPhotoNotes.h"
 #include "ieObjects/IETypedValues.h"
+#include "ieUtils/IENaturalNames.h"
 #include "ieUtils/IEVersion.h"
