@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <climits>
 #include <cstdint>
+#include <initializer_list>
 #include <random>
 #include <set>
 #include <string>
@@ -45,6 +46,16 @@ std::vector<std::wstring> handOut(FreeNumericNames& names, int count) {
 void addObjectsToRename(FreeNumericNames& names, int count) {
   for (int i = 0; i < count; ++i)
     names.addObject(-1);
+}
+
+// Names initialised over these used numbers and this many objects to rename.
+FreeNumericNames initialised(std::initializer_list<int> used, int objectsToRename) {
+  FreeNumericNames names;
+  for (const int number : used)
+    names.addObject(number);
+  addObjectsToRename(names, objectsToRename);
+  names.init();
+  return names;
 }
 
 // Used numbers `first`, first + step, first + 2 step, ... up to `last`, so that every gap between them
@@ -157,11 +168,7 @@ TEST(FreeNumericNames, NamesStartAboveTheHighestUsedName) {
 }
 
 TEST(FreeNumericNames, LastObjectCountsAboveTheHighestUsedNumber) {
-  FreeNumericNames names;
-  names.addObject(1);
-  names.addObject(5);
-  addObjectsToRename(names, 2);
-  names.init();
+  FreeNumericNames names = initialised({1, 5}, 2);
   EXPECT_EQ(6, names.getFirstAvailableNumber());
   EXPECT_EQ(7, names.getLastObject());
 }
@@ -250,11 +257,7 @@ TEST(FreeNumericNames, InvalidNamesReceiveFreshNames) {
 // --- Walking the gaps between used numbers ---
 
 TEST(FreeNumericNames, GapsAreWalkedWhenTheRenamedObjectsDoNotFitAboveTheHighestNumber) {
-  FreeNumericNames names;
-  names.addObject(2);
-  names.addObject(2147483640);
-  addObjectsToRename(names, 8);
-  names.init();
+  FreeNumericNames names = initialised({2, 2147483640}, 8);
   EXPECT_EQ(L"3", names.getFirstAvailableName());
   EXPECT_EQ(3, names.getFirstAvailableNumber());
   EXPECT_EQ(10, names.getLastObject());
@@ -262,33 +265,21 @@ TEST(FreeNumericNames, GapsAreWalkedWhenTheRenamedObjectsDoNotFitAboveTheHighest
 }
 
 TEST(FreeNumericNames, TheGapBelowTheLowestNumberIsUsedWhenItFits) {
-  FreeNumericNames names;
-  names.addObject(5);
-  names.addObject(2147483646);
-  addObjectsToRename(names, 4);
-  names.init();
+  FreeNumericNames names = initialised({5, 2147483646}, 4);
   EXPECT_EQ(1, names.getFirstAvailableNumber());
   EXPECT_EQ(4, names.getLastObject());
   EXPECT_EQ((std::vector<std::wstring>{L"1", L"2", L"3", L"4", L"6", L"7"}), handOut(names, 6));
 }
 
 TEST(FreeNumericNames, AGapOfExactlyTheCountToRenameFits) {
-  FreeNumericNames names;
-  for (const int used : {1, 4, 2147483646})
-    names.addObject(used);
-  addObjectsToRename(names, 2);
-  names.init();
+  FreeNumericNames names = initialised({1, 4, 2147483646}, 2);
   EXPECT_EQ(2, names.getFirstAvailableNumber());
   EXPECT_EQ(3, names.getLastObject());
   EXPECT_EQ((std::vector<std::wstring>{L"2", L"3", L"5"}), handOut(names, 3));
 }
 
 TEST(FreeNumericNames, HandingOutPastTheGapSkipsUsedNumbers) {
-  FreeNumericNames names;
-  for (const int used : {1, 4, 5, 7, 2147483646})
-    names.addObject(used);
-  addObjectsToRename(names, 2);
-  names.init();
+  FreeNumericNames names = initialised({1, 4, 5, 7, 2147483646}, 2);
   EXPECT_EQ(2, names.getFirstAvailableNumber());
   EXPECT_EQ(3, names.getLastObject());
   EXPECT_EQ((std::vector<std::wstring>{L"2", L"3", L"6", L"8", L"9"}), handOut(names, 5));
@@ -377,10 +368,7 @@ TEST(FreeNumericNames, AUsedNumber2147483647IsSkippedIntoDecimalNames) {
 }
 
 TEST(FreeNumericNames, LastObjectPastThe32BitRangeAnswersTheLimit) {
-  FreeNumericNames names;
-  names.addObject(2147483000);
-  addObjectsToRename(names, 500);
-  names.init();
+  FreeNumericNames names = initialised({2147483000}, 500);
   EXPECT_EQ(2147483500, names.getLastObject());
   handOut(names, 100);
   EXPECT_EQ(2147483600, names.getLastObject());  // counted from the current candidate
@@ -430,11 +418,7 @@ TEST(FreeNumericNames, NameForAnObjectBeforeInitIsEmptyAndKeepsTheCandidate) {
 // --- Copying ---
 
 TEST(FreeNumericNames, CopiesHandOutTheSameNamesIndependently) {
-  FreeNumericNames original;
-  for (const int used : {1, 4, 5, 2147483646})
-    original.addObject(used);
-  addObjectsToRename(original, 2);
-  original.init();
+  FreeNumericNames original = initialised({1, 4, 5, 2147483646}, 2);
   EXPECT_EQ(L"2", original.getNameFor(L"A"));
 
   FreeNumericNames copy(original);
