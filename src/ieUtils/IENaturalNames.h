@@ -55,7 +55,8 @@ class DEX_API StringNatural {
 // decimal text: 2147483647, 2147483648, ...).
 //
 // When no gap holds every object to rename, names start at 1 if the lowest used number is above 1, and
-// at 2147483647 otherwise; in both cases the scan has passed every used number, so none is skipped.
+// at 2147483647 otherwise. In both cases the scan has passed every used number, so none is skipped any
+// more: names handed out from 1 then meet numbers in use.
 //
 // Copying copies every member, so a copy hands out the same names as the original.
 class DEX_API FreeNumericNames {
@@ -94,7 +95,9 @@ class DEX_API FreeNumericNames {
   CVynStringT<wchar_t> getNameFor(const CVynStringT<wchar_t>& name);
   // The number the last object to rename will receive, counted from the current candidate: 0 before
   // init(); when numbers are not tracked, the count to rename while the current name is below
-  // 2147483647, else 2147483647. A result past the 32-bit range answers 2147483647.
+  // 2147483647, else 2147483647. A result past the 32-bit range answers 2147483647. Exact directly
+  // after init(); once names have been handed out, a count that fills a gap up to a used number counts
+  // that number as free.
   int getLastObject() const;
   // Names added that are not valid numeric names, plus negative numbers added.
   int getObjectsToRename() const;

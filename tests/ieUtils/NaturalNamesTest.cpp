@@ -278,6 +278,14 @@ TEST(FreeNumericNames, AGapOfExactlyTheCountToRenameFits) {
   EXPECT_EQ((std::vector<std::wstring>{L"2", L"3", L"5"}), handOut(names, 3));
 }
 
+TEST(FreeNumericNames, LastObjectAfterHandingOutCountsAFilledGapUpToItsUsedNumber) {
+  FreeNumericNames names = initialised({1, 4, 2147483646}, 2);
+  EXPECT_EQ(L"2", names.getNameFor(L"A"));
+  // From the candidate 3, two objects would receive 3 and 5; the count fills the gap up to 4 and
+  // takes 4 as the second.
+  EXPECT_EQ(4, names.getLastObject());
+}
+
 TEST(FreeNumericNames, HandingOutPastTheGapSkipsUsedNumbers) {
   FreeNumericNames names = initialised({1, 4, 5, 7, 2147483646}, 2);
   EXPECT_EQ(2, names.getFirstAvailableNumber());
