@@ -40,6 +40,10 @@ bool isNaturalLess(std::wstring_view a, std::wstring_view b) noexcept {
   return a < b;
 }
 
+int clampToInt(std::int64_t value) noexcept {
+  return static_cast<int>(std::clamp<std::int64_t>(value, INT_MIN, INT_MAX));
+}
+
 // The runtime's _wtoi in the C locale: leading blanks, an optional sign, then digits up to the first
 // other character; 0 when there are none. Out-of-range values clamp to INT_MIN or INT_MAX as the
 // Windows runtime does (no wrap-around).
@@ -57,12 +61,7 @@ int readLeadingInt(std::wstring_view text) noexcept {
   for (; position < text.size() && isDigit(text[position]); ++position) {
     magnitude = std::min(magnitude * 10 + (text[position] - L'0'), kMagnitudeLimit);
   }
-  const std::int64_t value = negative ? -magnitude : magnitude;
-  return static_cast<int>(std::clamp<std::int64_t>(value, INT_MIN, INT_MAX));
-}
-
-int clampToInt(std::int64_t value) noexcept {
-  return static_cast<int>(std::clamp<std::int64_t>(value, INT_MIN, INT_MAX));
+  return clampToInt(negative ? -magnitude : magnitude);
 }
 
 }  // namespace
