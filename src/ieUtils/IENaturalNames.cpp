@@ -161,20 +161,23 @@ void FreeNumericNames::init() {
   if (currentNumber_ == kObjectsAddedSinceInit) {
     currentNumber_ = kNumbersNotTracked;
     currentName_ = limitName_;
+    // The limit itself may be in use (only a number added as such can be).
+    if (highest == kNumbersNotTracked) ++currentName_;
   } else {
     currentName_.assignDecimal(static_cast<unsigned int>(currentNumber_));
   }
 }
 
 // Moves the scan position through the gaps between used numbers until one holds every object to rename.
-// A lowest used number above 1 makes 1 the candidate even when the gap below it is too small.
+// The gap below the lowest used number is taken only when it fits: starting at 1 in a gap that is too
+// small would hand out names of used numbers once the scan has passed them.
 void FreeNumericNames::walkGaps() {
   for (; scanPosition_ < usedNumbers_.size(); ++scanPosition_) {
     if (scanPosition_ == 0) {
       const int lowest = usedNumbers_.front();
-      if (lowest > 1) {
+      if (lowest > 1 && lowest - 1 >= objectsToRename_) {
         currentNumber_ = 1;
-        if (lowest - 1 >= objectsToRename_) return;
+        return;
       }
     } else {
       const int previous = usedNumbers_[scanPosition_ - 1];

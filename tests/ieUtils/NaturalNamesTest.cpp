@@ -324,16 +324,27 @@ TEST(FreeNumericNames, WithoutAFittingGapNamesGoBeyondThe32BitRange) {
   EXPECT_EQ((std::vector<std::wstring>{L"2147483647", L"2147483648", L"2147483649"}), handOut(names, 3));
 }
 
-TEST(FreeNumericNames, WithoutAFittingGapALowestNumberAboveOneMakesOneTheStart) {
+TEST(FreeNumericNames, WithoutAFittingGapATooSmallGapBelowTheLowestNumberIsNotTaken) {
   FreeNumericNames names;
   addEvenlySpaced(names, 2, 65536, 2147483646);
   names.addObject(2147483646);
   addObjectsToRename(names, 65536);
   names.init();
-  EXPECT_EQ(1, names.getFirstAvailableNumber());
-  EXPECT_EQ(65536, names.getLastObject());
-  // The walk has passed every used number, so none is skipped from here on.
-  EXPECT_EQ((std::vector<std::wstring>{L"1", L"2", L"3"}), handOut(names, 3));
+  // Starting at 1 would hand out 2, a used number, once the walk has passed it.
+  EXPECT_EQ(INT_MAX, names.getFirstAvailableNumber());
+  EXPECT_EQ(L"2147483647", names.getFirstAvailableName());
+  EXPECT_EQ((std::vector<std::wstring>{L"2147483647", L"2147483648", L"2147483649"}), handOut(names, 3));
+}
+
+TEST(FreeNumericNames, WithoutAFittingGapAUsedLimitIsNotHandedOut) {
+  FreeNumericNames names;
+  addEvenlySpaced(names, 1, 65536, 2147483646);
+  names.addObject(2147483646);
+  names.addObject(INT_MAX);
+  addObjectsToRename(names, 65536);
+  names.init();
+  EXPECT_EQ(INT_MAX, names.getFirstAvailableNumber());
+  EXPECT_EQ((std::vector<std::wstring>{L"2147483648", L"2147483649"}), handOut(names, 2));
 }
 
 // --- The end of the 32-bit range ---
@@ -464,8 +475,7 @@ std::int64_t firstFittingGap(const std::set<int>& used, int objectsToRename) {
   return 0;
 }
 
-// The first name the model hands out, or 0 for a case whose walk ends without a fitting gap above a
-// lowest used number of 2 or more (that start is covered on its own above).
+// The first name the model hands out.
 std::int64_t modelStart(const RandomCase& randomCase) {
   const std::set<int> used(randomCase.used.begin(), randomCase.used.end());
   if (used.empty()) return 1;
@@ -473,7 +483,7 @@ std::int64_t modelStart(const RandomCase& randomCase) {
   if (std::int64_t{INT_MAX} - 1 - highest >= randomCase.objectsToRename) return std::int64_t{highest} + 1;
   const std::int64_t gap = firstFittingGap(used, randomCase.objectsToRename);
   if (gap != 0) return gap;
-  return *used.begin() > 1 ? 0 : INT_MAX;
+  return INT_MAX;
 }
 
 std::vector<std::int64_t> freeNumbersFrom(std::int64_t start, const std::vector<int>& used, int count) {
