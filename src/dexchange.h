@@ -31,4 +31,8 @@
 #include "ieObjects/IEPhotoNotes.h"
 #include "ieObjects/IETypedValues.h"
 #include "ieUtils/IEFileReaders.h"
+#include "ieUtils/IENaturalNames.h"
+#include "ieUtils/IEUtilsCoords.h"
+#include "ieUtils/IEUtilsUnitWords.h"
+#include "ieUtils/IEUtilsUnits.h"
 #include "ieUtils/IEVersion.h"
