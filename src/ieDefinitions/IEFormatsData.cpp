@@ -107,7 +107,7 @@ const DexFormat* DexFormatsData::getFormatByIndex(unsigned int i) const {
 
 const DexFormat* DexFormatsData::getFormatByGuid(const GUID& g) const {
   for (const DexFormat* format : formats_) {
-    if (format->getGuid() == g) return format;
+    if (format != nullptr && format->getGuid() == g) return format;
   }
   return nullptr;
 }
@@ -120,7 +120,7 @@ const DexFormat* DexFormatsData::getFormatById(const wchar_t* id) const {
 
 unsigned int DexFormatsData::getIndexFormatById(const wchar_t* id) const {
   for (unsigned int i = 0; i < formats_.size(); ++i) {
-    if (formats_[i]->isIdEqual(id)) return i;
+    if (formats_[i] != nullptr && formats_[i]->isIdEqual(id)) return i;
   }
   return 0;
 }
@@ -128,7 +128,7 @@ unsigned int DexFormatsData::getIndexFormatById(const wchar_t* id) const {
 const DexFormat* DexFormatsData::getFormatByExtension(const CVynStringT<wchar_t>& extension,
                                                       bool withDot) const {
   for (const DexFormat* format : formats_) {
-    if (format->getExtension(withDot).CompareNoCase(extension) == 0) return format;
+    if (format != nullptr && format->getExtension(withDot).CompareNoCase(extension) == 0) return format;
   }
   return nullptr;
 }
@@ -162,7 +162,8 @@ void DexFormatsData::getSupportedFormats(vyn_vector<int>& out, DexCommonType::ED
                                          DexFlags<DexCommonType::ESupportedConfigurations> configurations,
                                          DexFlags<DexCommonType::EUsingModes> modes) const {
   for (std::size_t i = 0; i < formats_.size(); ++i) {
-    if (formats_[i]->compareCommonData(direction, configurations, modes)) out.push_back(static_cast<int>(i));
+    if (formats_[i] != nullptr && formats_[i]->compareCommonData(direction, configurations, modes))
+      out.push_back(static_cast<int>(i));
   }
 }
 
@@ -174,7 +175,8 @@ void DexFormatsData::getSupportedFormatsByDataType(
   if (getDataTypeById(type) == nullptr) return;
   for (std::size_t i = 0; i < formats_.size(); ++i) {
     const DexFormat* format = formats_[i];
-    if (format->isDataTypeSupported(type) && format->compareCommonData(direction, configurations, modes))
+    if (format != nullptr && format->isDataTypeSupported(type) &&
+        format->compareCommonData(direction, configurations, modes))
       out.push_back(static_cast<int>(i));
   }
 }

@@ -42,21 +42,27 @@ DEX_API void intializeIEformatsDataFromFile(const CVynStringT<wchar_t>& fileName
 // unique (the built-in table has an import row and an export row under one GUID): every lookup
 // answers the first match in list order.
 //
-// Formats data file ("IEFormatsData", XML in UTF-16 with byte-order mark), as written:
+// Formats data file ("IEFormatsData", XML in UTF-16 with byte-order mark and CR LF line ends), as
+// written (one element a line, indented by two blanks a level):
 //   <?xml version="1.0" encoding="utf-16"?>
 //   <IEFormatsData version="1.9" useDataFromFile="false" numberOfFormats="154">
 //     <IEFormats>
-//       <IEFormat guid="{...}" name="MapInfo (*.mif)" directionType="ImportExport"
-//                 importDLL="ImportParsers" exportDLL="ExportParsers" titleForVerticalScreen="MIF"
-//                 extension="mif" filterExtension="MIF Files (*.mif)|">
-//         <Configurations><REGULAR/><ONBOARD/></Configurations>
+//       <IEFormat guid="{C144E2ED-E0F1-4B21-ACEC-9D5FB675621A}" name="MapInfo (*.mif)"
+//                 directionType="ImportExport" importDLL="ImportParsers" exportDLL="ExportParsers"
+//                 titleForVerticalScreen="MIF" extension="mif" filterExtension="MIF Files (*.mif)|">
+//         <Configurations> <REGULAR/> <ONBOARD/> </Configurations>
 //         <UsingModes/>
-//         <DataTypes><POINTS/><LINES/><POINT_LISTS/><MULTIPLE/></DataTypes>
-//         <DistanceUnits used="true"><ANY_UNITS/></DistanceUnits>
+//         <DataTypes> <POINTS/> <LINES/> <POINT_LISTS/> <MULTIPLE/> </DataTypes>
+//         <DistanceUnits used="true"> <ANY_UNITS/> </DistanceUnits>
 //         <AngeUnits used="false"/>
 //         <Parameters/>
 //       </IEFormat>
 //       ...
+//     </IEFormats>
+//   </IEFormatsData>
+// The words are those of ieDefinitions/IEFormatWords.h and ieUtils/IEUtilsUnitWords.h. A file is read
+// in UTF-16 or UTF-8, whatever its layout. Only version 1.9 and later files are read, and only when
+// useDataFromFile is exactly "true"; a format element cut off by the end of a broken file is dropped.
 // Reading is lenient: an unknown child of IEFormat (line 2486) or an unknown word in a set
 // (configurations 2506, using modes 2519, data types 2552, distance units 2591, angle units 2607,
 // parameters 2668; the configuration word "CONTRACTOR" is ignored silently) costs one error-log record

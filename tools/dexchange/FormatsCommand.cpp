@@ -1,7 +1,5 @@
 #include <algorithm>
-#include <cstdint>
 #include <functional>
-#include <sstream>
 
 #include "Command.h"
 #include "hostlibs/VynString.h"
@@ -51,9 +49,11 @@ std::string joined(const std::vector<std::string>& words, const std::string& sep
 template <class E>
 bool parseWordList(const std::string& list, const std::function<bool(const WideString&, E&)>& lookup,
                    DexFlags<E>& set, std::string& error) {
-  std::stringstream stream(list);
-  std::string word;
-  while (std::getline(stream, word, ',')) {
+  std::size_t start = 0;
+  while (start <= list.size()) {
+    const std::size_t comma = std::min(list.find(',', start), list.size());
+    const std::string word = list.substr(start, comma - start);
+    start = comma + 1;
     E value{};
     if (!lookup(wide(word), value)) {
       error = word.empty() ? "empty word in \"" + list + "\"" : "unknown word " + word;
@@ -185,7 +185,7 @@ void printTable(std::ostream& out, const std::vector<FormatView>& views) {
 
 void printDetails(std::ostream& out, const FormatView& view) {
   const auto field = [&out](const std::string& label, const std::string& text) {
-    out << label << ':' << std::string(16 - label.size(), ' ') << orDash(text) << '\n';
+    out << label << ':' << std::string(15 - label.size(), ' ') << orDash(text) << '\n';
   };
   field("index", std::to_string(view.index));
   field("guid", view.guid);
