@@ -135,9 +135,10 @@ TEST(DexTimeMS, SubtractingEqualMillisecondsDoesNotBorrow) {
 
 TEST(DexTimeMS, AddingATimeToItselfDoublesIt) {
   DexTimeMS time(10, 600);
-  time += time;
+  const DexTimeMS& same = time;
+  time += same;
   expectTime(time, 21, 200);
-  time -= time;
+  time -= same;
   expectTime(time, 0, 0);
 }
 
