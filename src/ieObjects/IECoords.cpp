@@ -32,8 +32,8 @@ bool DexPosition2D::operator==(const DexPosition2D& other) const noexcept {
 }
 
 DexPosition2D& DexPosition2D::operator*=(double factor) noexcept {
-  for (double& coordinate : coords_)
-    coordinate *= factor;
+  x *= factor;
+  y *= factor;
   return *this;
 }
 
@@ -56,9 +56,9 @@ void DexPosition3D::shiftValues(const DexPosition3D& origin, double scaleX, doub
 }
 
 void DexPosition3D::reset() noexcept {
-  coords_[0] = 0.0;
-  coords_[1] = 0.0;
-  coords_[2] = 0.0;
+  x = 0.0;
+  y = 0.0;
+  z = 0.0;
 }
 
 bool DexPosition3D::isDefined() const noexcept {
@@ -72,23 +72,24 @@ bool DexPosition3D::operator==(const DexPosition3D& other) const noexcept {
 
 bool DexPosition3D::compareWithPrecision(const DexPosition3D& other, double tolerance) const noexcept {
   for (unsigned int i = 0; i < 3; ++i) {
-    if (!matchesWithin(coords_[i], other.coords_[i], tolerance)) return false;
+    if (!matchesWithin((*this)[i], other[i], tolerance)) return false;
   }
   return true;
 }
 
 bool DexPosition3D::operator<(const DexPosition3D& other) const noexcept {
   for (unsigned int i = 0; i < 3; ++i) {
-    if (!matchesWithin(coords_[i], other.coords_[i], kOrderTolerance)) {
-      return coords_[i] < other.coords_[i] - kOrderTolerance;
+    if (!matchesWithin((*this)[i], other[i], kOrderTolerance)) {
+      return (*this)[i] < other[i] - kOrderTolerance;
     }
   }
   return false;
 }
 
 DexPosition3D& DexPosition3D::operator*=(double factor) noexcept {
-  for (double& coordinate : coords_)
-    coordinate *= factor;
+  x *= factor;
+  y *= factor;
+  z *= factor;
   return *this;
 }
 

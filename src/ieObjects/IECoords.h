@@ -35,19 +35,19 @@ class DEX_API DexPosition2D {
 
   // ---- Construction ---------------------------------------------------------------------------
   DexPosition2D() noexcept = default;  // (0, 0)
-  DexPosition2D(double x, double y) noexcept : coords_{x, y} {}
+  DexPosition2D(double xValue, double yValue) noexcept : x(xValue), y(yValue) {}
   DexPosition2D(const DexPosition2D&) noexcept = default;
   DexPosition2D& operator=(const DexPosition2D&) noexcept = default;
   virtual ~DexPosition2D();
 
   // ---- Access ---------------------------------------------------------------------------------
-  double getX() const noexcept { return coords_[0]; }
-  double getY() const noexcept { return coords_[1]; }
-  void setX(double x) noexcept { coords_[0] = x; }
-  void setY(double y) noexcept { coords_[1] = y; }
-  // The two coordinates in the order x, y.
-  const double* getCoordinates() const noexcept { return coords_; }
-  double* getCoordinates() noexcept { return coords_; }
+  double getX() const noexcept { return x; }
+  double getY() const noexcept { return y; }
+  void setX(double value) noexcept { x = value; }
+  void setY(double value) noexcept { y = value; }
+  // The two coordinates in the order x, y (the fields are adjacent).
+  const double* getCoordinates() const noexcept { return &x; }
+  double* getCoordinates() noexcept { return &x; }
 
   // False only when x and y are both exactly 0.
   bool isDefined() const noexcept;
@@ -59,8 +59,9 @@ class DEX_API DexPosition2D {
   // Multiplies both coordinates by factor.
   DexPosition2D& operator*=(double factor) noexcept;
 
- private:
-  double coords_[2] = {0.0, 0.0};
+  // The coordinates, public as plug-ins read and write them directly.
+  double x = 0.0;
+  double y = 0.0;
 };
 
 // A spatial position (x, y, z), by value. (0, 0, 0) counts as "no position", and a z equal to kNoHeight
@@ -71,7 +72,7 @@ class DEX_API DexPosition3D {
 
   // ---- Construction ---------------------------------------------------------------------------
   DexPosition3D() noexcept { reset(); }
-  DexPosition3D(double x, double y, double z) noexcept : coords_{x, y, z} {}
+  DexPosition3D(double xValue, double yValue, double zValue) noexcept : x(xValue), y(yValue), z(zValue) {}
   DexPosition3D(const DexPosition3D&) noexcept = default;
   DexPosition3D& operator=(const DexPosition3D&) noexcept = default;
   virtual ~DexPosition3D();
@@ -87,18 +88,20 @@ class DEX_API DexPosition3D {
   void reset() noexcept;
 
   // ---- Access ---------------------------------------------------------------------------------
-  double getX() const noexcept { return coords_[0]; }
-  double getY() const noexcept { return coords_[1]; }
-  double getZ() const noexcept { return coords_[2]; }
-  void setX(double x) noexcept { coords_[0] = x; }
-  void setY(double y) noexcept { coords_[1] = y; }
-  void setZ(double z) noexcept { coords_[2] = z; }
+  double getX() const noexcept { return x; }
+  double getY() const noexcept { return y; }
+  double getZ() const noexcept { return z; }
+  void setX(double value) noexcept { x = value; }
+  void setY(double value) noexcept { y = value; }
+  void setZ(double value) noexcept { z = value; }
   // x, y, z for index 0, 1, 2; an index above 2 gives z.
-  double& operator[](unsigned int index) noexcept { return coords_[clampedIndex(index)]; }
-  const double& operator[](unsigned int index) const noexcept { return coords_[clampedIndex(index)]; }
-  // The three coordinates in the order x, y, z.
-  const double* getCoordinates() const noexcept { return coords_; }
-  double* getCoordinates() noexcept { return coords_; }
+  double& operator[](unsigned int index) noexcept { return index == 0 ? x : (index == 1 ? y : z); }
+  const double& operator[](unsigned int index) const noexcept {
+    return index == 0 ? x : (index == 1 ? y : z);
+  }
+  // The three coordinates in the order x, y, z (the fields are adjacent).
+  const double* getCoordinates() const noexcept { return &x; }
+  double* getCoordinates() noexcept { return &x; }
 
   // False when x, y and z are all exactly 0, or when z is kNoHeight; true otherwise.
   bool isDefined() const noexcept;
@@ -116,10 +119,10 @@ class DEX_API DexPosition3D {
   // Multiplies the three coordinates by factor.
   DexPosition3D& operator*=(double factor) noexcept;
 
- private:
-  static constexpr unsigned int clampedIndex(unsigned int index) noexcept { return index < 2 ? index : 2; }
-
-  double coords_[3] = {0.0, 0.0, 0.0};
+  // The coordinates, public as plug-ins read and write them directly.
+  double x = 0.0;
+  double y = 0.0;
+  double z = 0.0;
 };
 
 // A plane position with a name (fiducial marks and image points of the imaging data).
