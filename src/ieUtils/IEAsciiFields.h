@@ -228,10 +228,9 @@ namespace vyn::ie {
 // The user's custom ASCII layout inside the import and export settings: a delimiter, three flags and
 // the field list. The library copies the delimiter and the flags and reads only the field list; the
 // plug-ins and the settings give them their meaning.
-class DEX_API DexUserAsciiSettingsData {
+struct DEX_API DexUserAsciiSettingsData {
   VYN_CLASS_ALLOCATOR
 
- public:
   DexUserAsciiSettingsData() = default;
   DexUserAsciiSettingsData(const DexUserAsciiSettingsData&) = default;
   DexUserAsciiSettingsData& operator=(const DexUserAsciiSettingsData&) = default;

@@ -110,9 +110,10 @@ bool statusOf(int folder, const char* name, struct stat& status) {
 // not, and ignores case.
 class NameMatcher {
  public:
-  explicit NameMatcher(const wchar_t* mask)
-      : pattern_("*" + (mask == nullptr ? std::string() : vyn_text::toUtf8(mask))) {
-    if (pattern_ == "*.*") pattern_ = "*";
+  explicit NameMatcher(const wchar_t* mask) {
+    pattern_.push_back('*');
+    if (mask != nullptr) pattern_.append(vyn_text::toUtf8(mask));
+    if (pattern_ == "*.*") pattern_.resize(1);
   }
   bool matches(const char* name) const {
     const vyn_text::detail::CLocaleScope utf8Locale;  // multibyte names compare as characters

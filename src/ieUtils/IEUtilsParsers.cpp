@@ -3,6 +3,7 @@
 #include <cstddef>
 #include <string>
 #include <string_view>
+#include <utility>
 
 #include "ieUtils/detail/FieldText.h"
 
@@ -69,7 +70,7 @@ class QuotedValueScanner {
     const std::size_t end = static_cast<std::size_t>(last_ + 1);
     const std::wstring_view field =
         beginsWithQuote() ? collected.substr(1, end - 2) : collected.substr(0, end);
-    values_.Add(detail::cleanValue(field));
+    detail::appendValue(values_, detail::cleanValue(field));
     value_.clear();
     last_ = -1;
     quotes_ = 0;
@@ -105,7 +106,7 @@ void parseLeadingCommaValues(std::wstring_view line, StringArray& values, int ma
   for (int count = 0; count < maxCount && pos < line.size(); ++count) {
     const std::size_t comma = line.find(L',', pos);
     const std::size_t end = comma == std::wstring_view::npos ? line.size() : comma;
-    values.Add(detail::cleanValue(line.substr(pos, end - pos)));
+    detail::appendValue(values, detail::cleanValue(line.substr(pos, end - pos)));
     pos = end + 1;
   }
 }
@@ -119,12 +120,12 @@ bool parseValues(const String& line, StringArray& values, wchar_t delimiter, Str
   for (;;) {
     const std::size_t found = text.find(delimiter, pos);
     const std::size_t end = found == std::wstring_view::npos ? text.size() : found;
-    const String value = detail::cleanValue(text.substr(pos, end - pos));
+    String value = detail::cleanValue(text.substr(pos, end - pos));
     if (!forbiddenCharacters.empty() &&
         value.view().find_first_of(forbiddenCharacters) != std::wstring_view::npos) {
       return false;
     }
-    values.Add(value);
+    detail::appendValue(values, std::move(value));
     if (found == std::wstring_view::npos) return true;
     pos = found + 1;
   }

@@ -83,6 +83,7 @@ TEST(ParseValues, AppendsWithoutClearingTheList) {
 
 TEST(ParseValues, QuotesAreOrdinaryCharacters) {
   EXPECT_EQ(splitValues(L"\"a,b\""), listOf({L"\"a", L"b\""}));
+  EXPECT_EQ(splitValues(L"1,\"a,b"), listOf({L"1", L"\"a", L"b"}));
 }
 
 // ---- parseValuesInQuotes
@@ -197,6 +198,12 @@ TEST(ParseValuesForApaFormat, SplitsAtCommasWhateverDelimiterAndForbiddenSay) {
   StringArray values;
   EXPECT_TRUE(vyn::ie::utils::parseValuesForApaFormat(L" a ;b, c\r\n", values, ';', L"a"));
   EXPECT_EQ(values, listOf({L"a ;b", L"c"}));
+}
+
+TEST(ParseValuesForSimaFormat, KeepsNonAsciiTextAndQuotesAsTheyAre) {
+  StringArray values;
+  EXPECT_TRUE(vyn::ie::utils::parseValuesForSimaFormat(L"Straße,\"測量,x\"\r\n", values, ',', String()));
+  EXPECT_EQ(values, listOf({L"Straße", L"\"測量", L"x\""}));
 }
 
 TEST(ParseValuesForApaFormat, TrailingCommaAndEmptyLineAddNoEmptyValue) {

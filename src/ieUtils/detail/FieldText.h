@@ -1,8 +1,10 @@
 #pragma once
 
 #include <string_view>
+#include <utility>
 
 #include "hostlibs/VynString.h"
+#include "ieUtils/IEUtilsStringArray.h"
 
 // Cleaning of the values cut out of a line of an exchange file, shared by the parsers and the field
 // lists so that every reader trims a value the same way.
@@ -34,6 +36,12 @@ inline CVynStringT<wchar_t> cleanValue(std::wstring_view value) {
     cleaned.Remove(L'\n');
   }
   return cleaned;
+}
+
+// Appends value to values, moving its characters instead of copying them (the array's Add copies).
+inline void appendValue(StringArray& values, CVynStringT<wchar_t>&& value) {
+  const int index = values.Add(CVynStringT<wchar_t>());
+  values[index] = std::move(value);
 }
 
 }  // namespace vyn::ie::utils::detail
