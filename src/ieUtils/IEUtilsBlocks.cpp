@@ -4,10 +4,7 @@
 #include <string>
 #include <string_view>
 
-#if __has_include("hostlibs/VynFormats.h")
 #include "hostlibs/VynFormats.h"
-#define DEX_HAS_HOST_PIECE 1
-#endif
 #include "hostlibs/detail/Utf.h"
 
 namespace vyn::ie::utils {
@@ -82,12 +79,10 @@ bool createBlockString(const String& text, String& line, String& out, bool final
   return true;
 }
 
-#ifdef DEX_HAS_HOST_PIECE
 bool writeBlockString(FILE* file, const String& text, String& line, bool final) {
   String records;
   if (!createBlockString(text, line, records, final)) return false;
   return vyn_formats::WriteString(file, records);
 }
-#endif
 
 }  // namespace vyn::ie::utils

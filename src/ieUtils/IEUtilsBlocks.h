@@ -25,8 +25,8 @@ inline constexpr int kBlockLineLength = kBlockDataLength + 1;
 DEX_API bool createBlockString(const CVynStringT<wchar_t>& text, CVynStringT<wchar_t>& line,
                                CVynStringT<wchar_t>& out, bool final);
 
-// Runs createBlockString into an empty text and writes the records with the host's WriteString;
-// answers WriteString's result.
+// Runs createBlockString into an empty text and writes the records with the host's WriteString (in
+// UTF-8); answers its result, false for a null file or a failed write. The line moves on either way.
 DEX_API bool writeBlockString(FILE* file, const CVynStringT<wchar_t>& text, CVynStringT<wchar_t>& line,
                               bool final);
 

@@ -2,9 +2,13 @@
 
 #include <gtest/gtest.h>
 
+#include <cstdio>
+#include <memory>
 #include <string>
 #include <string_view>
 #include <vector>
+
+#include "support/TempDir.h"
 
 using String = CVynStringT<wchar_t>;
 namespace utils = vyn::ie::utils;
@@ -198,4 +202,51 @@ TEST(CreateBlockString, LineWithoutADigitIsFollowedByZero) {
   utils::createBlockString(textOf(std::wstring(128, L'a')), line, out, false);
   EXPECT_EQ(splitRecords(out.view())[0].digit, L'x');
   EXPECT_EQ(line, L"0");
+}
+
+// ---- Writing
+
+namespace {
+
+struct FileCloser {
+  void operator()(FILE* file) const { std::fclose(file); }
+};
+using FileHandle = std::unique_ptr<FILE, FileCloser>;
+
+}  // namespace
+
+TEST(WriteBlockString, WritesTheRecordsInUtf8) {
+  const dex_test::TempDir folder;
+  const std::string path = folder.file("blocks.dat");
+  String line;
+  {
+    const FileHandle file(std::fopen(path.c_str(), "wb"));
+    ASSERT_NE(file, nullptr);
+    EXPECT_TRUE(utils::writeBlockString(file.get(), L"\u00C4" + String(L'a', 150), line, false));
+    EXPECT_TRUE(utils::writeBlockString(file.get(), L"end", line, true));
+  }
+  const std::wstring first = L"\u00C4" + std::wstring(127, L'a');
+  const std::wstring second = std::wstring(23, L'a') + L"end" + std::wstring(102, L' ');
+  EXPECT_EQ(dex_test::readFile(path),
+            dex_test::narrow(expectedRecord(first, L'0') + expectedRecord(second, L'1')));
+  EXPECT_EQ(dex_test::readFile(path).substr(0, 3), "\x02\xC3\x84");
+  EXPECT_EQ(line, L"2");
+}
+
+TEST(WriteBlockString, PendingTextWritesNothingYet) {
+  const dex_test::TempDir folder;
+  const std::string path = folder.file("pending.dat");
+  String line;
+  {
+    const FileHandle file(std::fopen(path.c_str(), "wb"));
+    ASSERT_NE(file, nullptr);
+    EXPECT_TRUE(utils::writeBlockString(file.get(), L"short", line, false));
+  }
+  EXPECT_EQ(dex_test::readFile(path), "");
+  EXPECT_EQ(line, L"0short");
+}
+
+TEST(WriteBlockString, NullFileAnswersFalse) {
+  String line;
+  EXPECT_FALSE(utils::writeBlockString(nullptr, L"x", line, true));
 }
