@@ -32,7 +32,7 @@ std::size_t writeFittingAnsi(std::wstring_view text, char* dst, std::size_t capa
   for (const wchar_t ch : text) {
     const std::string bytes = ansiBytes(ch);
     if (bytes.size() > capacity - written) break;
-    std::memcpy(dst + written, bytes.data(), bytes.size());
+    std::copy(bytes.begin(), bytes.end(), dst + written);
     written += bytes.size();
   }
   return written;

@@ -113,6 +113,8 @@ void parseLeadingCommaValues(std::wstring_view line, StringArray& values, int ma
 
 }  // namespace
 
+// The text arguments are taken by value as the plug-ins' interface declares them.
+// NOLINTBEGIN(performance-unnecessary-value-param)
 bool parseValues(const String& line, StringArray& values, wchar_t delimiter, String forbidden) {
   const std::wstring_view text = line.view();
   const std::wstring_view forbiddenCharacters = forbidden.view();
@@ -150,6 +152,7 @@ bool parseValuesForSimaFormat(const String& line, StringArray& values, char /*de
   parseLeadingCommaValues(line.view(), values, kSimaValueCount);
   return true;
 }
+// NOLINTEND(performance-unnecessary-value-param)
 
 void removeBorderQuotes(String& text) {
   if (text.IsEmpty() || text[0] != kDoubleQuote) return;
