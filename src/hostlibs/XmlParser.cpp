@@ -1,0 +1,118 @@
+#include "hostlibs/XmlParser.h"
+
+#include <string>
+#include <string_view>
+
+#include "hostlibs/detail/XmlText.h"
+#include "hostlibs/detail/XmlTokenReader.h"
+
+namespace {
+
+using String = CVynStringT<wchar_t>;
+
+std::wstring_view viewOf(const wchar_t* text) noexcept {
+  return text == nullptr ? std::wstring_view() : std::wstring_view(text);
+}
+
+String stringOf(const std::wstring& text) {
+  return String(std::wstring_view(text));
+}
+
+}  // namespace
+
+CXmlParserBase::CXmlParserBase() = default;
+CXmlParserBase::~CXmlParserBase() = default;
+
+CXmlParserBase::CXmlParserBase(const CXmlParserBase& /*other*/) {}
+
+CXmlParserBase& CXmlParserBase::operator=(const CXmlParserBase& other) {
+  if (this != &other) Close();
+  return *this;
+}
+
+int CXmlParserBase::DoInitialize(const wchar_t* path, CXmlParserBase* parser) {
+  using vyn_text::detail::XmlTokenReader;
+  if (parser == nullptr) return INIT_NO_PARSER;
+  parser->Close();
+  auto reader = std::make_unique<XmlTokenReader>();
+  switch (reader->open(path)) {
+    case XmlTokenReader::OpenResult::Opened:
+      parser->reader_ = std::move(reader);
+      return INIT_OK;
+    case XmlTokenReader::OpenResult::CannotOpen:
+      return INIT_CANNOT_OPEN;
+    case XmlTokenReader::OpenResult::NotXml:
+      break;
+  }
+  return INIT_NOT_XML;
+}
+
+bool CXmlParserBase::IsOpen() const noexcept {
+  return reader_ != nullptr;
+}
+
+void CXmlParserBase::Close() noexcept {
+  reader_.reset();
+}
+
+bool CXmlParserBase::ReadToken(String& tag, String& attributes, String& value) {
+  vyn_text::detail::XmlToken token;
+  const bool read = reader_ != nullptr && reader_->next(token);
+  tag = stringOf(token.tag);
+  attributes = stringOf(token.attributes);
+  value = stringOf(token.value);
+  return read;
+}
+
+String CXmlParserBase::ReadAttrib(const String& attributes, const wchar_t* name) {
+  const std::wstring_view wanted = viewOf(name);
+  std::wstring found;
+  vyn_text::detail::forEachXmlAttribute(attributes.view(), [&](std::wstring_view key, std::wstring_view raw) {
+    if (key != wanted) return true;
+    found = vyn_text::detail::unescapeXml(raw);
+    return false;
+  });
+  return stringOf(found);
+}
+
+bool CXmlParserBase::IsUTF8() const noexcept {
+  return reader_ != nullptr && reader_->prolog().utf8;
+}
+bool CXmlParserBase::IsUTF16() const noexcept {
+  return reader_ != nullptr && reader_->prolog().utf16;
+}
+
+String CXmlParserBase::OpenTag(const wchar_t* tag, int typeFlag) {
+  std::wstring text = typeFlag == TAG_CLOSING ? L"</" : L"<";
+  text += viewOf(tag);
+  if (typeFlag == TAG_EMPTY_ELEMENT) text += L"/>";
+  if (typeFlag == TAG_CLOSING) text += L'>';
+  return stringOf(text);
+}
+
+String& CXmlParserBase::CloseTag(String& tagText, int typeFlag) {
+  tagText += typeFlag == TAG_EMPTY_ELEMENT ? L"/>" : L">";
+  return tagText;
+}
+
+String CXmlParserBase::FormAttrib(const wchar_t* name, const wchar_t* value) {
+  std::wstring text = L" ";
+  vyn_text::detail::appendXmlAttribute(text, viewOf(name), viewOf(value));
+  return stringOf(text);
+}
+
+String CXmlParserBase::EscapeText(const wchar_t* text) {
+  std::wstring escaped;
+  vyn_text::detail::appendXmlEscaped(escaped, viewOf(text), vyn_text::detail::XmlEscaping::Text);
+  return stringOf(escaped);
+}
+
+CXmlParser::CXmlParser(CTextFile* file) noexcept : textFile_(file) {}
+CXmlParser::~CXmlParser() = default;
+CXmlParser::CXmlParser(const CXmlParser& other) : CXmlParserBase(other), textFile_(other.textFile_) {}
+
+CXmlParser& CXmlParser::operator=(const CXmlParser& other) {
+  CXmlParserBase::operator=(other);
+  textFile_ = other.textFile_;
+  return *this;
+}

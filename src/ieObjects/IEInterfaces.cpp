@@ -1,0 +1,10 @@
+#include "ieObjects/IEInterfaces.h"
+
+namespace vyn::ie {
+
+// Out of line so that each interface has one virtual table and type identity, in the library.
+IDexNameInterface::~IDexNameInterface() = default;
+IDexIdInterface::~IDexIdInterface() = default;
+IDexStateInterface::~IDexStateInterface() = default;
+
+}  // namespace vyn::ie

@@ -1,0 +1,9 @@
+#include "ieObjects/IEPhotoNotes.h"
+
+namespace vyn::ie {
+
+DexPhotoNote::~DexPhotoNote() = default;
+
+DexPhotoNotes::~DexPhotoNotes() = default;
+
+}  // namespace vyn::ie
