@@ -6,10 +6,6 @@
 #include <string>
 #include <string_view>
 
-#if __has_include("hostlibs/File.h")
-#include "hostlibs/File.h"
-#define DEX_HAS_HOST_PIECE 1
-#endif
 #include "hostlibs/detail/Utf.h"
 
 namespace vyn::ie::utils {
@@ -113,7 +109,6 @@ void tsWChar2TChar(const wchar_t* src, wchar_t* dst) {
   tsTChar2WChar(src, dst);
 }
 
-#ifdef DEX_HAS_HOST_PIECE
 void writeUnicodeString(base::CFile& file, const String& text) {
   if (!file.Opened()) return;
   std::string bytes;
@@ -123,6 +118,5 @@ void writeUnicodeString(base::CFile& file, const String& text) {
   }
   file.Write(bytes.data(), bytes.size());
 }
-#endif
 
 }  // namespace vyn::ie::utils

@@ -3,11 +3,8 @@
 #include <cstddef>
 
 #include "hostlibs/DexApi.h"
+#include "hostlibs/File.h"
 #include "hostlibs/VynString.h"
-
-namespace base {
-class CFile;
-}
 
 // Conversions between wide text and the ANSI code page, which is UTF-8 on this platform. They do not
 // depend on the process locale. A character that UTF-8 cannot carry (a lone surrogate, a value above

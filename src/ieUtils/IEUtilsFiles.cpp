@@ -12,10 +12,7 @@
 #include <string>
 #include <string_view>
 
-#if __has_include("hostlibs/FileFuncs.h")
 #include "hostlibs/FileFuncs.h"
-#define DEX_HAS_HOST_PIECE 1
-#endif
 #include "hostlibs/detail/CLocale.h"
 #include "hostlibs/detail/Utf.h"
 
@@ -36,22 +33,6 @@ bool isSeparator(wchar_t ch) {
 
 constexpr unsigned long colourByte(unsigned value) {
   return value & 0xFFu;
-}
-
-// ---- File names
-
-// Index just past the last folder separator of path, 0 when it has none.
-std::size_t fileNameStart(std::wstring_view path) {
-  const std::size_t separator = path.find_last_of(L"/\\");
-  return separator == std::wstring_view::npos ? 0 : separator + 1;
-}
-
-// The file name without extension; a name whose only dot is its first character has no extension.
-String fileTitle(std::wstring_view path) {
-  std::wstring_view name = path.substr(fileNameStart(path));
-  const std::size_t dot = name.rfind(L'.');
-  if (dot != std::wstring_view::npos && dot > 0) name = name.substr(0, dot);
-  return String(name);
 }
 
 // ---- Folder listings
@@ -161,18 +142,18 @@ String rgb2Html(const unsigned long& rgb) {
 }
 
 String createFileName(const String& place, const String& name, bool placeIsFolder) {
-  if (!placeIsFolder) return String(place.view().substr(0, fileNameStart(place.view()))) + name;
+  if (!placeIsFolder) return vyn::file_names::extractDirNameWithSlashFromPathName(place) + name;
   String fileName = place;
   if (!isSeparator(place.GetAt(place.GetLength() - 1))) fileName += kFolderSeparator;
   return fileName + name;
 }
 
 String createNameFromFile(const String& path) {
-  return fileTitle(path.view());
+  return vyn::file_names::extractFileNameWithoutExtFromPathName(path);
 }
 
 String getNameFromFileName(const String& path) {
-  return fileTitle(path.view());
+  return vyn::file_names::extractFileNameWithoutExtFromPathName(path);
 }
 
 int isDots(const wchar_t* name) {
@@ -196,13 +177,11 @@ void findAllFilesInFolder(vyn_vector<WIN32_FIND_DATAW>& found, EFindFolder what,
   }
 }
 
-#ifdef DEX_HAS_HOST_PIECE
 String getIEAssistDataPath() {
   const String& path = assistDataPath();
   if (!path.IsEmpty()) return path;
   return vyn::folders::getExeDir() + String(kAssistDataSubfolder);
 }
-#endif
 
 void setIEAssistDataPath(String path) {
   assistDataPath() = std::move(path);

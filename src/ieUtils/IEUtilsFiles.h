@@ -22,7 +22,8 @@ DEX_API CVynStringT<wchar_t> rgb2Html(const unsigned long& rgb);
 // folder of the path place, with its trailing separator (nothing when place has no folder), and name.
 DEX_API CVynStringT<wchar_t> createFileName(const CVynStringT<wchar_t>& place,
                                             const CVynStringT<wchar_t>& name, bool placeIsFolder);
-// The file name of path without folder and extension ("/jobs/road.hal" gives "road").
+// The file name of path without folder and extension ("/jobs/road.hal" gives "road"); the extension
+// follows the name's last dot unless that dot is its first character (".profile" stays ".profile").
 DEX_API CVynStringT<wchar_t> createNameFromFile(const CVynStringT<wchar_t>& path);
 DEX_API CVynStringT<wchar_t> getNameFromFileName(const CVynStringT<wchar_t>& path);
 // 1 for "." and "..", else 0 (null included).

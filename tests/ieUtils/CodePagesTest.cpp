@@ -5,6 +5,9 @@
 #include <string>
 #include <vector>
 
+#include "hostlibs/File.h"
+#include "support/TempDir.h"
+
 using String = CVynStringT<wchar_t>;
 namespace utils = vyn::ie::utils;
 
@@ -162,4 +165,30 @@ TEST(TsTChar2WChar, CopiesUpToAndIncludingTheZero) {
   utils::tsWChar2TChar(nullptr, buffer.data());
   EXPECT_STREQ(buffer.data(), L"");
   utils::tsTChar2WChar(L"x", nullptr);
+}
+
+TEST(WriteUnicodeString, WritesLittleEndianUtf16UnitsWithoutTerminator) {
+  const dex_test::TempDir folder;
+  const std::wstring path = folder.wfile("units.bin");
+  base::CFile file;
+  ASSERT_TRUE(file.OpenForWriting(path.c_str()));
+  utils::writeUnicodeString(file, String(L"A\u00E4\u6E2C") + static_cast<wchar_t>(0x1F600));
+  utils::writeUnicodeString(file, String());
+  ASSERT_TRUE(file.Close());
+  EXPECT_EQ(dex_test::readFile(folder.file("units.bin")),
+            std::string("A\0\xE4\0\x2C\x6E\x3D\xD8\x00\xDE", 10));
+}
+
+TEST(WriteUnicodeString, ClosedFileIsLeftAlone) {
+  base::CFile closed;
+  utils::writeUnicodeString(closed, L"text");
+  EXPECT_FALSE(closed.Opened());
+
+  const dex_test::TempDir folder;
+  const std::string path = folder.write("existing.bin", "keep");
+  base::CFile reading;
+  ASSERT_TRUE(reading.OpenForReading(dex_test::widen(path).c_str()));
+  utils::writeUnicodeString(reading, L"text");
+  reading.Close();
+  EXPECT_EQ(dex_test::readFile(path), "keep");
 }

@@ -11,6 +11,7 @@
 #include <set>
 #include <string>
 
+#include "hostlibs/FileFuncs.h"
 #include "support/TempDir.h"
 
 using String = CVynStringT<wchar_t>;
@@ -78,6 +79,7 @@ TEST(GetNameFromFileName, DropsFolderAndExtension) {
   EXPECT_EQ(utils::getNameFromFileName(L"/jobs/"), L"");
   EXPECT_EQ(utils::createNameFromFile(L"/jobs/Straße.csv"), L"Straße");
   EXPECT_EQ(utils::createNameFromFile(L""), L"");
+  EXPECT_EQ(utils::createNameFromFile(L"/home/.profile"), L".profile");
 }
 
 TEST(IsDots, KnowsOnlyTheTwoDotEntries) {
@@ -224,6 +226,31 @@ TEST(FindAllFilesInFolder, LongestNamesFitTheEntry) {
   utils::findAllFilesInFolder(found, utils::FIND_FILES, folder.wpath().c_str(), nullptr);
   ASSERT_EQ(found.size(), 1u);
   EXPECT_EQ(std::wstring(found[0].cFileName), std::wstring(255, L'n'));
+}
+
+// ---- Assist-data folder
+
+namespace {
+
+// Leaves the process-wide folder empty again after each test.
+class AssistDataPath : public ::testing::Test {
+ protected:
+  void TearDown() override { utils::setIEAssistDataPath(String()); }
+};
+
+}  // namespace
+
+TEST_F(AssistDataPath, DefaultsToTheProgramFolder) {
+  const String folder = vyn::folders::getExeDir();
+  ASSERT_FALSE(folder.IsEmpty());
+  EXPECT_EQ(utils::getIEAssistDataPath(), folder + L"/vyndata/ie_assist");
+}
+
+TEST_F(AssistDataPath, TheFolderSetWinsUntilItIsEmptiedAgain) {
+  utils::setIEAssistDataPath(L"/srv/assist");
+  EXPECT_EQ(utils::getIEAssistDataPath(), L"/srv/assist");
+  utils::setIEAssistDataPath(String());
+  EXPECT_EQ(utils::getIEAssistDataPath(), vyn::folders::getExeDir() + L"/vyndata/ie_assist");
 }
 
 // ---- Lists and columns
