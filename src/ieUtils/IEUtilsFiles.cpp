@@ -11,6 +11,7 @@
 #include <memory>
 #include <string>
 #include <string_view>
+#include <utility>
 
 #include "hostlibs/FileFuncs.h"
 #include "hostlibs/detail/CLocale.h"
@@ -31,8 +32,17 @@ bool isSeparator(wchar_t ch) {
 
 // ---- Colours
 
-constexpr unsigned long colourByte(unsigned value) {
-  return value & 0xFFu;
+constexpr int kGreenShift = 8;
+constexpr int kBlueShift = 16;
+constexpr unsigned long kColourByte = 0xFFu;
+
+// Like the host system's colour macro, each part keeps only its low byte.
+constexpr unsigned long packColour(unsigned long red, unsigned long green, unsigned long blue) {
+  return (red & kColourByte) | ((green & kColourByte) << kGreenShift) | ((blue & kColourByte) << kBlueShift);
+}
+
+constexpr unsigned colourPart(unsigned long rgb, int shift) {
+  return static_cast<unsigned>((rgb >> shift) & kColourByte);
 }
 
 // ---- Folder listings
@@ -105,10 +115,9 @@ class NameMatcher {
   std::string pattern_;
 };
 
-bool isWanted(EFindFolder what, bool isFolder, const char* name) {
-  if (isFolder)
-    return (what & FIND_FOLDERS) != 0 && std::string_view(name) != "." && std::string_view(name) != "..";
-  return (what & FIND_FILES) != 0;
+bool isWanted(EFindFolder what, bool isFolder, std::string_view name) {
+  if (!isFolder) return (what & FIND_FILES) != 0;
+  return (what & FIND_FOLDERS) != 0 && name != "." && name != "..";
 }
 
 // ---- Assist-data folder
@@ -129,15 +138,14 @@ bool html2Rgb(const String& html, unsigned long& rgb) {
     const vyn_text::detail::CLocaleScope cLocale;
     static_cast<void>(std::swscanf(html.GetString() + 1, L"%2X%2X%2X", &red, &green, &blue));
   }
-  rgb = colourByte(red) | (colourByte(green) << 8) | (colourByte(blue) << 16);
+  rgb = packColour(red, green, blue);
   return true;
 }
 
 String rgb2Html(const unsigned long& rgb) {
   String html;
-  html.Format(L"#%02X%02X%02X", static_cast<unsigned>(colourByte(static_cast<unsigned>(rgb))),
-              static_cast<unsigned>(colourByte(static_cast<unsigned>(rgb >> 8))),
-              static_cast<unsigned>(colourByte(static_cast<unsigned>(rgb >> 16))));
+  html.Format(L"#%02X%02X%02X", colourPart(rgb, 0), colourPart(rgb, kGreenShift),
+              colourPart(rgb, kBlueShift));
   return html;
 }
 

@@ -44,7 +44,8 @@ enum EFindFolder : int {
 // characters), its attributes (FILE_ATTRIBUTE_DIRECTORY, FILE_ATTRIBUTE_READONLY when its owner may
 // not write it, otherwise FILE_ATTRIBUTE_NORMAL), its size (0 for a folder) and its times (the creation
 // time is the time of the last status change, which is the oldest time the system keeps). A null
-// folder, a missing folder or one that cannot be read leaves found empty.
+// folder, a missing folder or one that cannot be read leaves found empty; the folder read is folder
+// followed by "/", so an empty folder is the root folder.
 DEX_API void findAllFilesInFolder(vyn_vector<WIN32_FIND_DATAW>& found, EFindFolder what,
                                   const wchar_t* folder, const wchar_t* mask);
 
