@@ -8,7 +8,8 @@
 // Fixed block records. A record carries 128 data characters between STX (0x02) and, after them, the
 // sequence digit 0 to 9, the checksum as decimal text of at least three digits, ETX (0x03), CR and LF.
 // The checksum is the exclusive or of the 129 characters (data and sequence digit) taken as UTF-16
-// code units, so it may need four or five digits. The caller holds the pending line between calls:
+// code units (a character beyond U+FFFF gives both units of its surrogate pair), so it may need four
+// or five digits. The caller holds the pending line between calls:
 // its first character is the sequence digit of the record being filled, followed by the data
 // collected so far.
 namespace vyn::ie::utils {

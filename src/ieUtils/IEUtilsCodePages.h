@@ -8,8 +8,8 @@
 
 // Conversions between wide text and the ANSI code page, which is UTF-8 on this platform. They do not
 // depend on the process locale. A character that UTF-8 cannot carry (a lone surrogate, a value above
-// U+10FFFF) is converted as U+FFFD, three bytes. A null pointer argument makes a function do nothing
-// (a null source counts as the empty text).
+// U+10FFFF) is converted as U+FFFD, three bytes. A null destination makes a function write nothing;
+// a null source counts as the empty text.
 namespace vyn::ie::utils {
 
 // The bytes of the ANSI form of text, without a terminating zero.
