@@ -13,6 +13,8 @@ DEX_API void* vyn_operator_new(std::size_t size) noexcept;
 
 // Class-level allocation through the host allocator. Put it in the class body; the base list stays as
 // it is. The allocation functions are noexcept, so a failed `new` yields null instead of throwing.
+// The macro expands to member declarations, which cannot be parenthesised.
+// NOLINTBEGIN(bugprone-macro-parentheses)
 #define VYN_CLASS_ALLOCATOR                                      \
  public:                                                         \
   static void* operator new(std::size_t size) noexcept {         \
@@ -31,3 +33,4 @@ DEX_API void* vyn_operator_new(std::size_t size) noexcept;
     std::free(block);                                            \
   }                                                              \
   static void operator delete(void*, void*) noexcept {}
+// NOLINTEND(bugprone-macro-parentheses)

@@ -94,7 +94,9 @@ LibraryHandle findAndOpen(const std::string& name, std::string& error) {
   const std::string fileName = libraryFileName(name);
   std::string firstFoundError;
   for (const std::string& folder : searchFolders()) {
-    const std::string candidate = folder + "/" + fileName;
+    std::string candidate = folder;
+    candidate += '/';
+    candidate += fileName;
     if (access(candidate.c_str(), F_OK) != 0) continue;
     std::string candidateError;
     if (LibraryHandle handle = openLibrary(candidate, candidateError)) return handle;

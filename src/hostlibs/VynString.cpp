@@ -53,6 +53,7 @@ bool renderFormat(std::wstring& out, const wchar_t* format, va_list arguments) {
   while (true) {
     va_list copy;
     va_copy(copy, arguments);
+    // NOLINTNEXTLINE(clang-analyzer-valist.Uninitialized): copy is initialised by va_copy above
     const int written = std::vswprintf(buffer.data(), buffer.size(), format, copy);
     va_end(copy);
     if (written >= 0) {

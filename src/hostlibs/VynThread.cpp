@@ -278,7 +278,7 @@ HANDLE startThread(const wchar_t* sourceFile, int line, const wchar_t* threadNam
       handleTable().remove(handle);
       return refuseStart(sourceFile, line, name, systemError(created));
     }
-    threadReference.release();  // the thread owns it now
+    static_cast<void>(threadReference.release());  // the thread owns it now
     return handle;
   } catch (...) {
     return refuseStart(sourceFile, line, name, "out of memory");

@@ -145,8 +145,8 @@ BOOL SystemTimeToFileTime(const SYSTEMTIME* systemTime, FILETIME* fileTime) {
   if (systemTime == nullptr || fileTime == nullptr || !isValidSystemTime(*systemTime)) return 0;
   const std::int64_t days =
       daysFromCivil(systemTime->wYear, systemTime->wMonth, systemTime->wDay) + kDaysFrom1601To1970;
-  const std::int64_t seconds =
-      days * kSecondsPerDay + systemTime->wHour * 3600 + systemTime->wMinute * 60 + systemTime->wSecond;
+  const std::int64_t seconds = days * kSecondsPerDay + std::int64_t{systemTime->wHour} * 3600 +
+                               std::int64_t{systemTime->wMinute} * 60 + systemTime->wSecond;
   *fileTime = fileTimeOf(seconds * kTicksPerSecond + systemTime->wMilliseconds * kTicksPerMillisecond);
   return 1;
 }

@@ -112,6 +112,7 @@ CXmlParser::~CXmlParser() = default;
 CXmlParser::CXmlParser(const CXmlParser& other) : CXmlParserBase(other), textFile_(other.textFile_) {}
 
 CXmlParser& CXmlParser::operator=(const CXmlParser& other) {
+  if (&other == this) return *this;
   CXmlParserBase::operator=(other);
   textFile_ = other.textFile_;
   return *this;

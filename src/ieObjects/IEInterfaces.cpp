@@ -6,5 +6,7 @@ namespace vyn::ie {
 IDexNameInterface::~IDexNameInterface() = default;
 IDexIdInterface::~IDexIdInterface() = default;
 IDexStateInterface::~IDexStateInterface() = default;
+IDexTimeInterface::~IDexTimeInterface() = default;
+IDexObjInterface::~IDexObjInterface() = default;
 
 }  // namespace vyn::ie

@@ -2,14 +2,13 @@
 
 #include "hostlibs/DexApi.h"
 #include "hostlibs/VynString.h"
+#include "hostlibs/VynTime.h"
+#include "ieObjects/IEObjectsType.h"
 
 // The small abstract interfaces that the objects of the data model are assembled from. None holds
 // data; construction, copy and assignment do nothing. They carry no class allocator of their own: a
 // class that combines several of them declares VYN_CLASS_ALLOCATOR itself, so that `new` is never
 // ambiguous.
-//
-// The time interface (IDexTimeInterface) and the object-kind interface (IDexObjInterface) join these
-// once the host time type and the object kinds are available.
 namespace vyn::ie {
 
 // An object with a name. Names are stored and returned unchanged (no trimming, no validation).
@@ -55,6 +54,30 @@ class DEX_API IDexStateInterface {
 
   virtual void setStateType(ECurrentState state) = 0;
   virtual ECurrentState getStateType() const = 0;
+};
+
+// An object with a time stamp (raw observations, job-history records).
+class DEX_API IDexTimeInterface {
+ public:
+  IDexTimeInterface() = default;
+  IDexTimeInterface(const IDexTimeInterface&) = default;
+  IDexTimeInterface& operator=(const IDexTimeInterface&) = default;
+  virtual ~IDexTimeInterface();
+
+  virtual void setTime(const base::CTime& time) = 0;
+  virtual const base::CTime& getTime() const = 0;
+};
+
+// An object of a dataset that tells its kind. getType() is not const: that is its signature in the
+// plug-in interface.
+class DEX_API IDexObjInterface {
+ public:
+  IDexObjInterface() = default;
+  IDexObjInterface(const IDexObjInterface&) = default;
+  IDexObjInterface& operator=(const IDexObjInterface&) = default;
+  virtual ~IDexObjInterface();
+
+  virtual EDexObjectsType getType() = 0;
 };
 
 }  // namespace vyn::ie
