@@ -6,6 +6,7 @@
 #include <string>
 
 #include "support/LogCapture.h"
+#include "support/VtableSlot.h"
 
 using vyn::ie::DexCommonType;
 using vyn::ie::DexDataType;
@@ -139,6 +140,17 @@ TEST(DexCommonType, TheFilterAsksTheVirtualOperations) {
   // The stored sets are what the subclass overrides.
   EXPECT_TRUE(everywhere.getConfigurations().isEmpty());
   EXPECT_EQ(Modes(DexCommonType::EXPORT_IN_JAPAN), everywhere.getUsingModes());
+}
+
+TEST(DexCommonType, DeclaresItsVirtualOperationsInSlotOrderWithTheDestructorLast) {
+  if (!dex_test::vtableEntryOf(&DexCommonType::getName)) GTEST_SKIP() << "virtual table layout unknown here";
+  EXPECT_EQ(0, dex_test::vtableEntryOf(&DexCommonType::getName));
+  EXPECT_EQ(1, dex_test::vtableEntryOf(&DexCommonType::getDataDirections));
+  EXPECT_EQ(2, dex_test::vtableEntryOf(&DexCommonType::isConfigurationSupported));
+  EXPECT_EQ(3, dex_test::vtableEntryOf(&DexCommonType::isUsingModeApplied));
+  // The subclasses add no virtual operation of their own.
+  EXPECT_EQ(3, dex_test::vtableEntryOf(&DexFormat::isUsingModeApplied));
+  EXPECT_EQ(3, dex_test::vtableEntryOf(&DexDataType::isUsingModeApplied));
 }
 
 // ---- DexDataType --------------------------------------------------------------------------------
