@@ -13,7 +13,7 @@ namespace {
 
 using ascii_fields::EType;
 
-bool isControlCodePlace(DexCodeValues::ECodeControlCode place) noexcept {
+bool isControlCodePlace(int place) noexcept {
   return place >= 0 && place < DexCodeValues::kNumberOfControlCodes;
 }
 
@@ -207,12 +207,12 @@ CVynStringT<wchar_t> DexCodeValues::getCodeStringAt(int index) const {
   return codeStrings_.GetAt(index);
 }
 
-CVynStringT<wchar_t> DexCodeValues::getControlCode(ECodeControlCode place) const {
+CVynStringT<wchar_t> DexCodeValues::getControlCode(int place) const {
   if (!isControlCodePlace(place)) return {};
   return controlCodes_[static_cast<std::size_t>(place)];
 }
 
-void DexCodeValues::setControlCode(ECodeControlCode place, const CVynStringT<wchar_t>& controlCode) {
+void DexCodeValues::setControlCode(int place, const CVynStringT<wchar_t>& controlCode) {
   if (isControlCodePlace(place)) controlCodes_[static_cast<std::size_t>(place)] = controlCode;
 }
 

@@ -101,8 +101,8 @@ class DEX_API DexCodeValues {
   CVynStringT<wchar_t> getCodeStringAt(int index) const;
 
   // Control codes. A place outside 0 to 2 reads as an empty text and is ignored by the setter.
-  CVynStringT<wchar_t> getControlCode(ECodeControlCode place) const;
-  void setControlCode(ECodeControlCode place, const CVynStringT<wchar_t>& controlCode);
+  CVynStringT<wchar_t> getControlCode(int place) const;
+  void setControlCode(int place, const CVynStringT<wchar_t>& controlCode);
   // True when controlCode equals one of the three control codes (exact), including an empty text
   // against an empty place.
   bool doesCodeHasControlCode(const CVynStringT<wchar_t>& controlCode) const;

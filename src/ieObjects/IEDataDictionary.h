@@ -152,18 +152,12 @@ class DEX_API DexCodeDescription : public IDexNameInterface {
   int findAttrDescriptionIndex(const CVynStringT<wchar_t>& name) const;
 
   // Drawing properties. The getters answer null for a type outside 0 to 2 or when none is held.
-  IDexDrawProperties* getDrawProperties(IDexDrawProperties::EDexDrawType type) noexcept {
-    return drawProperties_.get(type);
-  }
-  const IDexDrawProperties* getDrawProperties(IDexDrawProperties::EDexDrawType type) const noexcept {
-    return drawProperties_.get(type);
-  }
+  IDexDrawProperties* getDrawProperties(int type) noexcept { return drawProperties_.get(type); }
+  const IDexDrawProperties* getDrawProperties(int type) const noexcept { return drawProperties_.get(type); }
   // Takes ownership of properties (null allowed) and deletes the object held before, unless it is the
   // same pointer. Ignored for a type outside 0 to 2 and for an object already held under another type;
   // the caller then keeps properties.
-  void setDrawProperties(IDexDrawProperties::EDexDrawType type, IDexDrawProperties* properties) {
-    drawProperties_.set(type, properties);
-  }
+  void setDrawProperties(int type, IDexDrawProperties* properties) { drawProperties_.set(type, properties); }
   // True when a property object is held for any geometry kind (defined values or not).
   bool isDrawPropertiesWasDefined() const noexcept { return drawProperties_.hasAny(); }
 
