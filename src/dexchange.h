@@ -38,6 +38,7 @@
 #include "ieUtils/IEAsciiFields.h"
 #include "ieUtils/IEFileReaders.h"
 #include "ieUtils/IENaturalNames.h"
+#include "ieUtils/IESettings.h"
 #include "ieUtils/IEUtils.h"
 #include "ieUtils/IEUtilsBlocks.h"
 #include "ieUtils/IEUtilsCodePages.h"
