@@ -41,6 +41,7 @@
 #include "ieUtils/IEAutoCADUtils.h"
 #include "ieUtils/IEFileReaders.h"
 #include "ieUtils/IENaturalNames.h"
+#include "ieUtils/IESettings.h"
 #include "ieUtils/IEUtils.h"
 #include "ieUtils/IEUtilsBlocks.h"
 #include "ieUtils/IEUtilsCodePages.h"
