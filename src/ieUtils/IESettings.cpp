@@ -1,5 +1,7 @@
 #include "ieUtils/IESettings.h"
 
+#include <utility>
+
 #include <cstring>
 
 namespace {
@@ -22,9 +24,10 @@ void replace(T*& owned, T* replacement) noexcept {
   owned = replacement;
 }
 
-// The copies of the owned objects: host objects through their own clone(), records made anew.
+// The copies of the owned objects: host objects through their own clone(), records made anew. The
+// source is taken as the settings hold it (not const), so a host object's plain clone() is reached.
 template <class T>
-T* copyOf(const T* source) {
+T* copyOf(T* source) {
   if (source == nullptr) return nullptr;
   if constexpr (requires { source->clone(); })
     return source->clone();
@@ -33,7 +36,7 @@ T* copyOf(const T* source) {
 }
 
 // The option block's layout belongs to the host and the plug-ins, so it is copied as plain bytes.
-DexOptionBlock* copyOf(const DexOptionBlock* source) {
+DexOptionBlock* copyOf(DexOptionBlock* source) {
   if (source == nullptr) return nullptr;
   auto* const copy = new DexOptionBlock;
   if (copy != nullptr) std::memcpy(copy->bytes, source->bytes, DexOptionBlock::kSize);
@@ -42,13 +45,13 @@ DexOptionBlock* copyOf(const DexOptionBlock* source) {
 
 // A field that always follows the source: its copy, or null when the source has none.
 template <class T>
-void takeCopy(T*& target, const T* source) {
+void takeCopy(T*& target, T* source) {
   replace(target, copyOf(source));
 }
 
 // A field that follows the source only when the source has an object; otherwise it keeps its own.
 template <class T>
-void takeCopyWhenPresent(T*& target, const T* source) {
+void takeCopyWhenPresent(T*& target, T* source) {
   if (source != nullptr) replace(target, copyOf(source));
 }
 
@@ -58,7 +61,26 @@ namespace vyn::ie {
 
 // The interfaces' key functions: their virtual tables live in the library.
 IDexMessageBox::~IDexMessageBox() = default;
+IDexMessageBox* IDexMessageBox::clone() {
+  return std::as_const(*this).clone();
+}
+IDexMessageBox* IDexMessageBox::clone() const {
+  return nullptr;
+}
+int IDexMessageBox::confirmOverwrite(HWND parentWindow, const wchar_t* shortPath) {
+  return std::as_const(*this).confirmOverwrite(parentWindow, shortPath);
+}
+int IDexMessageBox::confirmOverwrite(HWND /*parentWindow*/, const wchar_t* /*shortPath*/) const {
+  return IDNO;
+}
+
 IDexFinishNotifier::~IDexFinishNotifier() = default;
+IDexFinishNotifier* IDexFinishNotifier::clone() {
+  return std::as_const(*this).clone();
+}
+IDexFinishNotifier* IDexFinishNotifier::clone() const {
+  return nullptr;
+}
 
 DexSettings::DexSettings() {
   reset();

@@ -33,11 +33,15 @@ class DEX_API IDexMessageBox {
   VYN_CLASS_ALLOCATOR
 
   virtual ~IDexMessageBox();
-  // A new message box owned by the caller; null when it cannot be made.
-  virtual IDexMessageBox* clone() const = 0;
+  // A new message box owned by the caller; null when it cannot be made. Implement either form: each
+  // default answers the other (the const default answers null).
+  virtual IDexMessageBox* clone();
   // Asks whether the file shown as shortPath may be overwritten, as a child of parentWindow. Answers
-  // the dialog's button: IDYES (6) allows the overwrite, any other answer declines it.
-  virtual int confirmOverwrite(HWND parentWindow, const wchar_t* shortPath) const = 0;
+  // the dialog's button: IDYES (6) allows the overwrite, any other answer declines it. Implement either
+  // form: the library asks through this one, whose default asks the const form (whose default is IDNO).
+  virtual int confirmOverwrite(HWND parentWindow, const wchar_t* shortPath);
+  virtual IDexMessageBox* clone() const;
+  virtual int confirmOverwrite(HWND parentWindow, const wchar_t* shortPath) const;
 
  protected:
   IDexMessageBox() = default;
@@ -54,9 +58,11 @@ class DEX_API IDexFinishNotifier {
   VYN_CLASS_ALLOCATOR
 
   virtual ~IDexFinishNotifier();
-  // A new notifier owned by the caller; null when it cannot be made.
-  virtual IDexFinishNotifier* clone() const = 0;
+  // A new notifier owned by the caller; null when it cannot be made. Implement either form: each
+  // default answers the other (the const default answers null).
+  virtual IDexFinishNotifier* clone();
   virtual void onFinished(EDexResult result) = 0;
+  virtual IDexFinishNotifier* clone() const;
 
  protected:
   IDexFinishNotifier() = default;

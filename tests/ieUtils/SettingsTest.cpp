@@ -587,8 +587,11 @@ TEST(DexSettings, ChainedCopiesNeitherLeakNorShare) {
 
 TEST(IDexMessageBox, KeepsDestructorCloneAndConfirmOverwriteInThatOrder) {
   EXPECT_TRUE(std::has_virtual_destructor_v<IDexMessageBox>);
-  const auto clone = dex_test::vtableEntryOf(&IDexMessageBox::clone);
-  const auto confirmOverwrite = dex_test::vtableEntryOf(&IDexMessageBox::confirmOverwrite);
+  using Clone = IDexMessageBox* (IDexMessageBox::*)();
+  using Confirm = int (IDexMessageBox::*)(HWND, const wchar_t*);
+  const auto clone = dex_test::vtableEntryOf(static_cast<Clone>(&IDexMessageBox::clone));
+  const auto confirmOverwrite =
+      dex_test::vtableEntryOf(static_cast<Confirm>(&IDexMessageBox::confirmOverwrite));
   if (!clone) GTEST_SKIP() << "virtual table layout not known on this platform";
   EXPECT_EQ(2, *clone);
   EXPECT_EQ(3, *confirmOverwrite);
@@ -601,9 +604,53 @@ TEST(IDexMessageBox, AnswersThroughTheHostsObject) {
   EXPECT_EQ(IDYES, asked.confirmOverwrite(nullptr, L"/jobs/a.txt"));
 }
 
+namespace {
+
+// Host objects written against either form of the operations: plain or const.
+class PlainMessageBox : public IDexMessageBox {
+ public:
+  IDexMessageBox* clone() override { return new PlainMessageBox(*this); }
+  int confirmOverwrite(HWND, const wchar_t*) override { return IDYES; }
+};
+
+class ConstMessageBox : public IDexMessageBox {
+ public:
+  IDexMessageBox* clone() const override { return new ConstMessageBox(*this); }
+  int confirmOverwrite(HWND, const wchar_t*) const override { return IDYES; }
+};
+
+class PlainNotifier : public IDexFinishNotifier {
+ public:
+  IDexFinishNotifier* clone() override { return new PlainNotifier(*this); }
+  void onFinished(EDexResult) override {}
+};
+
+template <class Box>
+int askThroughCopiedSettings() {
+  DexSettings settings;
+  settings.messageBox = new Box();
+  const DexSettings copy(settings);
+  if (copy.messageBox == nullptr || copy.messageBox == settings.messageBox) return -1;
+  return copy.messageBox->confirmOverwrite(nullptr, L"a.txt");
+}
+
+}  // namespace
+
+TEST(IDexMessageBox, EitherFormOfTheOperationsServes) {
+  EXPECT_EQ(IDYES, askThroughCopiedSettings<PlainMessageBox>());
+  EXPECT_EQ(IDYES, askThroughCopiedSettings<ConstMessageBox>());
+
+  DexSettings settings;
+  settings.importNotifier = new PlainNotifier();
+  const DexSettings copy(settings);
+  EXPECT_NE(nullptr, copy.importNotifier);
+  EXPECT_NE(settings.importNotifier, copy.importNotifier);
+}
+
 TEST(IDexFinishNotifier, KeepsDestructorCloneAndOnFinishedInThatOrder) {
   EXPECT_TRUE(std::has_virtual_destructor_v<IDexFinishNotifier>);
-  const auto clone = dex_test::vtableEntryOf(&IDexFinishNotifier::clone);
+  using Clone = IDexFinishNotifier* (IDexFinishNotifier::*)();
+  const auto clone = dex_test::vtableEntryOf(static_cast<Clone>(&IDexFinishNotifier::clone));
   const auto onFinished = dex_test::vtableEntryOf(&IDexFinishNotifier::onFinished);
   if (!clone) GTEST_SKIP() << "virtual table layout not known on this platform";
   EXPECT_EQ(2, *clone);
