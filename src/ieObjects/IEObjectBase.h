@@ -65,6 +65,7 @@ class DEX_API DexObject : public IDexStateInterface,
   // degrees) by the station rule of DexStation::shiftCoords.
   virtual void shiftCoords(const DexPosition3D& origin, double scaleX, double scaleY, double scaleZ,
                            double rotation) = 0;
+  // Not const, like getType(): that is its signature in the plug-in interface.
   virtual EGroupType getGroupType() = 0;
 
  protected:
