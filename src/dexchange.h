@@ -24,6 +24,7 @@
 #include "ieDefinitions/IEFormats.h"
 #include "ieDefinitions/IEFormatsData.h"
 #include "ieDefinitions/IEResult.h"
+#include "ieObjects/IEAlignmentPartsDictionary.h"
 #include "ieObjects/IEArcs.h"
 #include "ieObjects/IECodesDataInterface.h"
 #include "ieObjects/IECoords.h"
