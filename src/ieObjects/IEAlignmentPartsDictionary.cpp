@@ -42,7 +42,8 @@ bool DexAlignmentPartsDictionary::addAlignmentPart(IDexAlignmentPart* part) {
     return false;
   }
   PartList* const list = listOf(part->getType());
-  return list != nullptr && list->add(part);
+  if (list == nullptr) return false;
+  return list->indexOf(part) >= 0 || list->add(part);
 }
 
 int DexAlignmentPartsDictionary::getNumberOfElements(int kind) const {

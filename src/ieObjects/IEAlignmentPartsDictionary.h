@@ -88,7 +88,8 @@ class DEX_API DexAlignmentPartsDictionary {
 
   // Appends part to the list of its kind and takes ownership: true. Names are not checked. Declined
   // (false; the caller keeps part) with an error-log record for null (line 801) and for a part whose
-  // getType() is outside 0 to 3 (line 802).
+  // getType() is outside 0 to 3 (line 802). A part the dictionary holds already changes nothing and
+  // answers true.
   bool addAlignmentPart(IDexAlignmentPart* part);
 
   // The number of parts of that kind; -1 and an error-log record (line 802) for a kind outside 0 to 3.

@@ -58,7 +58,8 @@ class DEX_API DexRoadTemplatesDictionary {
   virtual ~DexRoadTemplatesDictionary();
 
   // Files roadTemplate under its current name and takes ownership: true. Declined (false; the caller
-  // keeps it) for null and when a template of that name is present (the present one stays).
+  // keeps it) for null and when a template of that name is present (the present one stays). A
+  // template the dictionary holds already changes nothing and answers true.
   bool addRoadTemplate(DexRoadTemplate* roadTemplate) {
     return roadTemplate != nullptr && templates_.add(roadTemplate->getName(), roadTemplate);
   }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <map>
+#include <unordered_set>
 #include <utility>
 
 namespace vyn::ie {
@@ -26,12 +27,18 @@ class DexOwningMap {
   ~DexOwningMap() { clear(); }
 
   // Stores item under key and takes ownership: true. Declined (false) for null and when key is
-  // present; the present item stays and the caller keeps item. Adding the item already stored under
-  // key also answers false and changes nothing.
+  // present; the present item stays and the caller keeps item. An item the map already holds (under
+  // any key) changes nothing and answers true, so that the caller never deletes an item the map owns.
   bool add(const Key& key, T* item) {
     if (item == nullptr) return false;
-    return items_.try_emplace(key, item).second;
+    if (held_.contains(item)) return true;
+    if (!items_.try_emplace(key, item).second) return false;
+    held_.insert(item);
+    return true;
   }
+
+  // True when the map holds item.
+  bool holds(const T* item) const { return held_.contains(item); }
 
   // The item stored under key, or null.
   T* find(const Key& key) const {
@@ -45,6 +52,7 @@ class DexOwningMap {
     if (found == items_.end()) return false;
     T* const item = found->second;
     items_.erase(found);
+    held_.erase(item);
     delete item;
     return true;
   }
@@ -53,6 +61,7 @@ class DexOwningMap {
   void clear() noexcept {
     Map items;
     items.swap(items_);
+    held_.clear();
     for (auto& entry : items)
       delete entry.second;
   }
@@ -63,6 +72,7 @@ class DexOwningMap {
 
  private:
   Map items_;
+  std::unordered_set<const T*> held_;
 };
 
 }  // namespace vyn::ie

@@ -82,6 +82,19 @@ TEST(AlignmentPartsDictionary, DeclinesNullAndPartsOfAnUnknownKindWithLogRecords
   EXPECT_EQ(1, deletions);  // once, by its owner: the dictionary did not take it
 }
 
+TEST(AlignmentPartsDictionary, PartHeldAlreadyIsNotTakenTwice) {
+  int deletions = 0;
+  {
+    DexAlignmentPartsDictionary dictionary;
+    auto* const part = new TestPart(IDexAlignmentPart::CROSS_SECTION_SET, L"C", &deletions);
+    EXPECT_TRUE(dictionary.addAlignmentPart(part));
+    part->setName(L"renamed");
+    EXPECT_TRUE(dictionary.addAlignmentPart(part));
+    EXPECT_EQ(1, dictionary.getNumberOfElements(IDexAlignmentPart::CROSS_SECTION_SET));
+  }
+  EXPECT_EQ(1, deletions);
+}
+
 TEST(AlignmentPartsDictionary, DeletesEveryPartWithItself) {
   int deletions = 0;
   {

@@ -20,11 +20,15 @@ TEST(OwningMap, KeepsTheFirstItemOfAKeyAndLeavesDeclinedItemsWithTheCaller) {
     EXPECT_TRUE(map.add(2, first));
     Counted declined(deletions);
     EXPECT_FALSE(map.add(2, &declined));
-    EXPECT_FALSE(map.add(2, first));
+    EXPECT_TRUE(map.add(2, first));  // held already: nothing changes
+    EXPECT_TRUE(map.add(5, first));  // not even under another key
     EXPECT_FALSE(map.add(3, nullptr));
     EXPECT_TRUE(map.add(1, new Counted(deletions)));
     EXPECT_EQ(2, map.count());
     EXPECT_EQ(first, map.find(2));
+    EXPECT_EQ(nullptr, map.find(5));
+    EXPECT_TRUE(map.holds(first));
+    EXPECT_FALSE(map.holds(&declined));
     EXPECT_EQ(nullptr, map.find(3));
     EXPECT_EQ(1, map.begin()->first);
     EXPECT_EQ(0, deletions);
