@@ -5,3 +5,5 @@ tool=${1:-build/tools/dexchange/dexchange}
 run() { echo "\$ dexchange $*"; "$tool" "$@"; echo; }
 run --version
 run --help
+# The formats a host offers when the user exports points.
+run formats --export --type POINTS

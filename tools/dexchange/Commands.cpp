@@ -2,10 +2,12 @@
 
 namespace dexchange_tool {
 
+std::unique_ptr<Command> makeFormatsCommand();
 std::unique_ptr<Command> makeVersionCommand();
 
 std::vector<std::unique_ptr<Command>> makeCommands() {
   std::vector<std::unique_ptr<Command>> commands;
+  commands.push_back(makeFormatsCommand());
   commands.push_back(makeVersionCommand());
   return commands;
 }
