@@ -17,6 +17,7 @@
 #include "support/FuzzInput.h"
 #include "support/FuzzText.h"
 #include "support/ScratchFile.h"
+#include "support/XmlTokens.h"
 
 namespace {
 
@@ -63,50 +64,6 @@ std::unique_ptr<DexXmlParser> open(const std::wstring& path) {
   return std::unique_ptr<DexXmlParser>(parser);
 }
 
-// Every name="value" of a serialised attribute list reads back through ReadAttrib and forms again
-// into the same text through FormAttrib: what the reader writes, its own helpers understand.
-void checkAttributes(const String& attributes) {
-  const std::wstring_view text = attributes.view();
-  std::size_t at = 0;
-  while (at < text.size()) {
-    const std::size_t equals = text.find(L"=\"", at);
-    DEX_FUZZ_CHECK(equals != std::wstring_view::npos);
-    const std::size_t close = text.find(L'"', equals + 2);
-    DEX_FUZZ_CHECK(close != std::wstring_view::npos);
-    const std::wstring name(text.substr(at, equals - at));
-    const std::wstring_view serialised = text.substr(at, close + 1 - at);
-    // Only the first attribute of a name is found by ReadAttrib; XML allows no second one.
-    const String value = CXmlParserBase::ReadAttrib(attributes, name.c_str());
-    DEX_FUZZ_CHECK(CXmlParserBase::FormAttrib(name.c_str(), value.GetString()).view() ==
-                   L" " + std::wstring(serialised));
-    at = close + 1;
-    if (at < text.size()) {
-      DEX_FUZZ_CHECK(text[at] == L' ');
-      ++at;
-    }
-  }
-}
-
-void checkToken(const String& tag, const String& attributes, const String& value) {
-  if (!tag.IsEmpty() && tag[0] == L'/') DEX_FUZZ_CHECK(attributes.IsEmpty() && value.IsEmpty());
-  if (!value.IsEmpty()) DEX_FUZZ_CHECK(attributes.IsEmpty());
-  checkAttributes(attributes);
-}
-
-// Reads every token; answers how many there were.
-std::size_t readToEnd(DexXmlParser& parser, std::size_t byteCount) {
-  DEX_FUZZ_CHECK(!(parser.IsUTF8() && parser.IsUTF16()));
-  String tag, attributes, value;
-  std::size_t tokens = 0;
-  while (parser.ReadToken(tag, attributes, value)) {
-    checkToken(tag, attributes, value);
-    DEX_FUZZ_CHECK(++tokens <= byteCount + 1);
-  }
-  DEX_FUZZ_CHECK(tag.IsEmpty() && attributes.IsEmpty() && value.IsEmpty());
-  DEX_FUZZ_CHECK(!parser.ReadToken(tag, attributes, value));
-  return tokens;
-}
-
 void readRawDocument(const dex_fuzz::ScratchFile& scratch, Layout layout, std::string_view rest) {
   const std::string bytes = fileBytes(layout, rest);
   if (!scratch.write(bytes)) return;
@@ -116,7 +73,7 @@ void readRawDocument(const dex_fuzz::ScratchFile& scratch, Layout layout, std::s
   DexXmlParser copy(*parser);
   String tag, attributes, value;
   DEX_FUZZ_CHECK(!copy.ReadToken(tag, attributes, value) && !copy.IsOpen());
-  readToEnd(*parser, bytes.size());
+  dex_fuzz::readXmlToEnd(*parser, bytes.size());
 }
 
 // text as the reader must give it back: up to its first NUL (the writers take C strings), with the
@@ -154,7 +111,7 @@ void readWrittenDocument(const dex_fuzz::ScratchFile& scratch, Layout layout, st
   DEX_FUZZ_CHECK(parser->ReadToken(tag, attributes, value) && tag.IsEmpty());  // the declaration
   DEX_FUZZ_CHECK(parser->ReadToken(tag, attributes, value) && tag == L"R");
   DEX_FUZZ_CHECK(CXmlParserBase::ReadAttrib(attributes, L"a").view() == expected);
-  checkAttributes(attributes);
+  dex_fuzz::checkXmlAttributes(attributes);
   if (!isBlank(expected)) {
     DEX_FUZZ_CHECK(parser->ReadToken(tag, attributes, value) && tag == L"R");
     DEX_FUZZ_CHECK(value.view() == expected);

@@ -65,7 +65,9 @@ TEST(Tool, WrongCommandLinesFailWithOneLine) {
 TEST(Tool, PrintsTheSameUnderACommaDecimalLocale) {
   const dex_test::CommaLocale comma;  // compiles the locale into the build tree when none is installed
   if (!comma.active()) GTEST_SKIP() << comma.reason();
-  for (const char* arguments : {"--help", "--version", "version --help", "frobnicate"}) {
+  for (const char* arguments :
+       {"--help", "--version", "version --help", "frobnicate", "formats", "formats --json",
+        "formats --export --type POINTS --json", "formats --help"}) {
     const ToolRun plain = runTool(arguments, "LC_ALL=C");
     const ToolRun commaRun = runTool(arguments, comma.environment());
     EXPECT_EQ(commaRun.exitCode, plain.exitCode) << arguments;
