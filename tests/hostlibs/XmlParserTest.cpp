@@ -3,7 +3,6 @@
 #include <gtest/gtest.h>
 
 #include <chrono>
-#include <fstream>
 #include <string>
 #include <thread>
 #include <vector>
@@ -482,18 +481,6 @@ namespace {
 
 // --- Limits
 
-// Writes the file piece by piece: a head, count copies of a block, a tail.
-std::string writeRepeated(const dex_test::TempDir& dir, const char* name, const std::string& head,
-                          const std::string& block, std::size_t count, const std::string& tail) {
-  const std::string path = dir.file(name);
-  std::ofstream out(path, std::ios::binary);
-  out << head;
-  for (std::size_t i = 0; i < count; ++i)
-    out << block;
-  out << tail;
-  return path;
-}
-
 TEST(CXmlParserLimits, GivesAtMostTheFirst256LevelsOfADocumentNested10000Deep) {
   constexpr std::size_t kLevels = 10000;
   constexpr std::size_t kDeepestNesting = 256;
@@ -502,7 +489,7 @@ TEST(CXmlParserLimits, GivesAtMostTheFirst256LevelsOfADocumentNested10000Deep) {
   for (std::size_t i = 0; i < kLevels; ++i)
     closing += "</a>";
   const std::string path =
-      writeRepeated(dir, "deep.xml", "<?xml version=\"1.0\"?>", "<a x=\"1\">", kLevels, "text" + closing);
+      dir.writeRepeated("deep.xml", "<?xml version=\"1.0\"?>", "<a x=\"1\">", kLevels, "text" + closing);
   CXmlParser parser;
   ASSERT_EQ(initialize(path, parser), CXmlParserBase::INIT_OK);
   const std::vector<Token> tokens = readAll(parser);
@@ -517,8 +504,8 @@ TEST(CXmlParserLimits, GivesAtMostTheFirst256LevelsOfADocumentNested10000Deep) {
 
 TEST(CXmlParserLimits, RefusesAnAttributeOfAHundredMegabytes) {
   const dex_test::TempDir dir;
-  const std::string path = writeRepeated(dir, "huge-attribute.xml", "<?xml version=\"1.0\"?><r a=\"",
-                                         std::string(1 << 20, 'x'), 100, "\" b=\"2\"><p/></r>");
+  const std::string path = dir.writeRepeated("huge-attribute.xml", "<?xml version=\"1.0\"?><r a=\"",
+                                             std::string(1 << 20, 'x'), 100, "\" b=\"2\"><p/></r>");
   CXmlParser parser;
   EXPECT_EQ(initialize(path, parser), CXmlParserBase::INIT_NOT_XML);
   EXPECT_FALSE(parser.IsOpen());
@@ -527,8 +514,8 @@ TEST(CXmlParserLimits, RefusesAnAttributeOfAHundredMegabytes) {
 TEST(CXmlParserLimits, EndsTheStreamAtAnAttributeOfAHundredMegabytesAfterAGoodStart) {
   const dex_test::TempDir dir;
   const std::string path =
-      writeRepeated(dir, "late-huge-attribute.xml", "<r>" + std::string(4096, ' ') + "<p a=\"1\"/><q a=\"",
-                    std::string(1 << 20, 'y'), 100, "\"/></r>");
+      dir.writeRepeated("late-huge-attribute.xml", "<r>" + std::string(4096, ' ') + "<p a=\"1\"/><q a=\"",
+                        std::string(1 << 20, 'y'), 100, "\"/></r>");
   CXmlParser parser;
   ASSERT_EQ(initialize(path, parser), CXmlParserBase::INIT_OK);
   const std::vector<Token> tokens = readAll(parser);
@@ -539,8 +526,8 @@ TEST(CXmlParserLimits, EndsTheStreamAtAnAttributeOfAHundredMegabytesAfterAGoodSt
 
 TEST(CXmlParserLimits, EndsTheStreamAtTextOfMoreThanTenMillionCharactersSplitByComments) {
   const dex_test::TempDir dir;
-  const std::string path = writeRepeated(dir, "long-text.xml", "<r><p>short</p><q>",
-                                         std::string(1 << 20, 'z') + "<!-- -->", 11, "</q></r>");
+  const std::string path = dir.writeRepeated("long-text.xml", "<r><p>short</p><q>",
+                                             std::string(1 << 20, 'z') + "<!-- -->", 11, "</q></r>");
   CXmlParser parser;
   ASSERT_EQ(initialize(path, parser), CXmlParserBase::INIT_OK);
   const std::vector<Token> tokens = readAll(parser);
