@@ -1,6 +1,7 @@
 #!/usr/bin/env bash
 # Runs the libFuzzer programs of a fuzz build one after the other, each for a given time on a scratch
-# copy of its seed corpus (fuzz/corpus/ is never written), with its dictionary when it has one.
+# copy of its seed corpus (fuzz/corpus/ is never written), with its dictionary and its options
+# (fuzz/options/<target>.options, one libFuzzer option a line) when it has them.
 # Usage: scripts/fuzz.sh <fuzz build dir> <seconds per target> [target...]   (default: every target)
 # Each target leaves its log, its grown corpus and any crash, leak, timeout or out-of-memory input in
 # <build>/fuzz-runs/<target>/; a summary line per target goes to <build>/fuzz-runs/summary.txt. The
@@ -38,6 +39,11 @@ for target in "${targets[@]}"; do
   options=(-max_total_time="$seconds" -timeout=25 -rss_limit_mb=2560 -print_final_stats=1
            -artifact_prefix="$work/artifacts/")
   [[ -f fuzz/dict/$target.dict ]] && options+=(-dict="$PWD/fuzz/dict/$target.dict")
+  if [[ -f fuzz/options/$target.options ]]; then
+    while read -r option; do
+      [[ -z $option || $option == \#* ]] || options+=("-$option")
+    done <"fuzz/options/$target.options"
+  fi
 
   echo "fuzz: $target for ${seconds}s"
   TIMEFORMAT='%3U %3S'
