@@ -197,7 +197,7 @@ CVynStringT<wchar_t> DexDrawAreaProperties::getFillStyleTypeAsString(EFillStyleT
 
 namespace {
 
-bool isDrawType(IDexDrawProperties::EDexDrawType type) {
+bool isDrawType(int type) {
   const auto index = static_cast<std::int64_t>(type);
   return index >= 0 && index < IDexDrawProperties::kNumberOfDrawTypes;
 }
@@ -220,15 +220,15 @@ DexDrawPropertiesByType& DexDrawPropertiesByType::operator=(const DexDrawPropert
 
 DexDrawPropertiesByType::~DexDrawPropertiesByType() = default;
 
-IDexDrawProperties* DexDrawPropertiesByType::get(IDexDrawProperties::EDexDrawType type) noexcept {
+IDexDrawProperties* DexDrawPropertiesByType::get(int type) noexcept {
   return isDrawType(type) ? objects_[static_cast<std::size_t>(type)].get() : nullptr;
 }
 
-const IDexDrawProperties* DexDrawPropertiesByType::get(IDexDrawProperties::EDexDrawType type) const noexcept {
+const IDexDrawProperties* DexDrawPropertiesByType::get(int type) const noexcept {
   return isDrawType(type) ? objects_[static_cast<std::size_t>(type)].get() : nullptr;
 }
 
-bool DexDrawPropertiesByType::set(IDexDrawProperties::EDexDrawType type, IDexDrawProperties* properties) {
+bool DexDrawPropertiesByType::set(int type, IDexDrawProperties* properties) {
   if (!isDrawType(type)) return false;
   auto& slot = objects_[static_cast<std::size_t>(type)];
   if (slot.get() == properties) return true;

@@ -275,12 +275,12 @@ class DEX_API DexDrawPropertiesByType {
   virtual ~DexDrawPropertiesByType();
 
   // The object held for type, or null (always null for a type outside 0 to 2).
-  IDexDrawProperties* get(IDexDrawProperties::EDexDrawType type) noexcept;
-  const IDexDrawProperties* get(IDexDrawProperties::EDexDrawType type) const noexcept;
+  IDexDrawProperties* get(int type) noexcept;
+  const IDexDrawProperties* get(int type) const noexcept;
   // Takes ownership of properties (which may be null) for type, deleting the object held before
   // unless it is the same pointer, and returns true. Declined (false; the caller keeps properties)
   // for a type outside 0 to 2, and for an object already held under another type.
-  bool set(IDexDrawProperties::EDexDrawType type, IDexDrawProperties* properties);
+  bool set(int type, IDexDrawProperties* properties);
 
   // True when an object is held for any type.
   bool hasAny() const noexcept;

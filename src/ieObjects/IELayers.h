@@ -45,12 +45,8 @@ class DEX_API DexLayer : public IDexNameInterface, public IDexIdInterface {
 
   // Drawing properties. The getters answer null for a type outside 0 to 2 or when none is held; the
   // typed shortcuts also answer null when the object held for that kind is of another class.
-  IDexDrawProperties* getDrawProperties(IDexDrawProperties::EDexDrawType type) {
-    return drawProperties_.get(type);
-  }
-  const IDexDrawProperties* getDrawProperties(IDexDrawProperties::EDexDrawType type) const {
-    return drawProperties_.get(type);
-  }
+  IDexDrawProperties* getDrawProperties(int type) { return drawProperties_.get(type); }
+  const IDexDrawProperties* getDrawProperties(int type) const { return drawProperties_.get(type); }
   DexDrawPointProperties* getDrawPointProperties();
   const DexDrawPointProperties* getDrawPointProperties() const;
   DexDrawLineProperties* getDrawLineProperties();
@@ -60,9 +56,7 @@ class DEX_API DexLayer : public IDexNameInterface, public IDexIdInterface {
   // Takes ownership of properties (null allowed) and deletes the object held before, unless it is
   // the same pointer. Ignored for a type outside 0 to 2 and for an object the layer already holds
   // under another type; the caller then keeps properties.
-  void setDrawProperties(IDexDrawProperties::EDexDrawType type, IDexDrawProperties* properties) {
-    drawProperties_.set(type, properties);
-  }
+  void setDrawProperties(int type, IDexDrawProperties* properties) { drawProperties_.set(type, properties); }
   // Sets the colour of each property object the layer holds; creates none.
   void setColor(unsigned long color) { drawProperties_.setColor(color); }
 

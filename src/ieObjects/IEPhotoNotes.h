@@ -29,8 +29,8 @@ class DEX_API DexPhotoNote {
   virtual ~DexPhotoNote();
 
   // The value of kind; 0.0 for a kind outside 0 to 2, which setData ignores.
-  double getData(EPhotoPropertyDataType kind) const { return data_.get(kind); }
-  void setData(EPhotoPropertyDataType kind, double value) { data_.set(kind, value); }
+  double getData(int kind) const { return data_.get(kind); }
+  void setData(int kind, double value) { data_.set(kind, value); }
 
   const CVynStringT<wchar_t>& getFileName() const noexcept { return fileName_; }
   void setFileName(const CVynStringT<wchar_t>& fileName) { fileName_ = fileName; }

@@ -15,7 +15,7 @@ constexpr unsigned int kFlagBits = 32;
 constexpr int kFirstExclusiveFlag = 1;
 constexpr int kLastExclusiveFlag = 4;
 
-constexpr unsigned int bitOf(EPointAttrFlags flag) noexcept {
+constexpr unsigned int bitOf(unsigned int flag) noexcept {
   return 1u << (static_cast<unsigned int>(flag) % kFlagBits);
 }
 
@@ -133,11 +133,11 @@ void DexStation::setGeoidHeight(double geoidHeight) noexcept {
   geoidHeightDefined_ = true;
 }
 
-bool DexStation::hasPointAttr(EPointAttrFlags flag) const noexcept {
+bool DexStation::hasPointAttr(unsigned int flag) const noexcept {
   return (stationAttrs_ & bitOf(flag)) != 0;
 }
 
-void DexStation::addPointAttr(EPointAttrFlags flag) {
+void DexStation::addPointAttr(unsigned int flag) {
   stationAttrs_ |= bitOf(flag);
   if (!hasExactlyOneExclusiveFlag(stationAttrs_)) {
     vyn_logging::vyn_err_log(detail::kCoordsLogSource, detail::kExclusivePointAttrsLine);

@@ -112,11 +112,11 @@ class DEX_API DexStation : public DexPosition3D,
   unsigned int getStationAttrs() const noexcept { return stationAttrs_; }
   void setStationAttrs(unsigned int stationAttrs) noexcept { stationAttrs_ = stationAttrs; }
   // Bit flag (taken modulo 32) of the attribute set.
-  bool hasPointAttr(EPointAttrFlags flag) const noexcept;
+  bool hasPointAttr(unsigned int flag) const noexcept;
   // Sets bit flag (modulo 32). When afterwards none or more than one of the exclusive flags 1 to 4 is
   // set, one error-log record is written (source ieObjects\IECoords, line 201, empty message); the bit
   // stays set either way.
-  void addPointAttr(EPointAttrFlags flag);
+  void addPointAttr(unsigned int flag);
 
   // ---- Further properties ---------------------------------------------------------------------
   EDexCSType getCSType() const noexcept { return csType_; }

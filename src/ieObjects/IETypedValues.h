@@ -1,10 +1,16 @@
 #pragma once
 
 #include <array>
+#include <concepts>
 #include <cstddef>
 #include <cstdint>
+#include <type_traits>
 
 namespace vyn::ie {
+
+// A kind argument: the class's enumeration or a plain number (plug-ins often pass numbers).
+template <class K>
+concept DexKindArgument = std::is_enum_v<K> || std::integral<K>;
 
 // A fixed array of N values indexed by a class's kind enumeration: the storage behind the many
 // "typed value records" of the data model (road elements, raw observations, reports, imaging). A
@@ -30,15 +36,20 @@ class DexTypedArray {
 
   static constexpr int size() noexcept { return static_cast<int>(N); }
   // True when kind indexes an element of the array.
-  static constexpr bool contains(Kind kind) noexcept {
+  template <DexKindArgument K = Kind>
+  static constexpr bool contains(K kind) noexcept {
     const auto index = static_cast<std::int64_t>(kind);
     return index >= 0 && index < static_cast<std::int64_t>(N);
   }
 
   // The value of kind; the neutral value T{} for a kind outside the array.
-  const T& get(Kind kind) const noexcept { return contains(kind) ? values_[indexOf(kind)] : neutral(); }
+  template <DexKindArgument K = Kind>
+  const T& get(K kind) const noexcept {
+    return contains(kind) ? values_[indexOf(kind)] : neutral();
+  }
   // Stores value under kind and returns true; a kind outside the array changes nothing (false).
-  constexpr bool set(Kind kind, const T& value) {
+  template <DexKindArgument K = Kind>
+  constexpr bool set(K kind, const T& value) {
     if (!contains(kind)) return false;
     values_[indexOf(kind)] = value;
     return true;
@@ -52,7 +63,10 @@ class DexTypedArray {
   friend constexpr bool operator==(const DexTypedArray&, const DexTypedArray&) = default;
 
  private:
-  static constexpr std::size_t indexOf(Kind kind) noexcept { return static_cast<std::size_t>(kind); }
+  template <DexKindArgument K>
+  static constexpr std::size_t indexOf(K kind) noexcept {
+    return static_cast<std::size_t>(kind);
+  }
   static const T& neutral() noexcept {
     static const T value{};
     return value;
