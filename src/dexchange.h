@@ -24,6 +24,10 @@
 #include "ieDefinitions/IEFormats.h"
 #include "ieDefinitions/IEFormatsData.h"
 #include "ieDefinitions/IEResult.h"
+<<<<<<< Updated upstream
+=======
+#include "ieObjects/IEAlignment.h"
+>>>>>>> Stashed changes
 #include "ieObjects/IEAlignmentPartsDictionary.h"
 #include "ieObjects/IEArcs.h"
 #include "ieObjects/IECodesDataInterface.h"
@@ -31,18 +35,30 @@
 #include "ieObjects/IECrossSections.h"
 #include "ieObjects/IEDLRawData.h"
 #include "ieObjects/IEDataDictionary.h"
+#include "ieObjects/IEDataset.h"
+#include "ieObjects/IEDatasetProperties.h"
 #include "ieObjects/IEDrawProperties.h"
+<<<<<<< Updated upstream
 #include "ieObjects/IEGPSAntennaSettings.h"
 #include "ieObjects/IEInterfaces.h"
 #include "ieObjects/IEJobInfo.h"
+=======
+#include "ieObjects/IEFindChainage.h"
+#include "ieObjects/IEGPSRawData.h"
+#include "ieObjects/IEInterfaces.h"
+#include "ieObjects/IEJobHistory.h"
+#include "ieObjects/IEJobHistoryRecords.h"
+>>>>>>> Stashed changes
 #include "ieObjects/IELayers.h"
 #include "ieObjects/IENoValue.h"
 #include "ieObjects/IEObjectBase.h"
 #include "ieObjects/IEObjectList.h"
 #include "ieObjects/IEObjects.h"
 #include "ieObjects/IEObjectsType.h"
+#include "ieObjects/IEOrientationJob.h"
 #include "ieObjects/IEOwnedPointer.h"
 #include "ieObjects/IEOwningList.h"
+<<<<<<< Updated upstream
 #include "ieObjects/IEOwningMap.h"
 #include "ieObjects/IEPhotoNotes.h"
 #include "ieObjects/IEPoints.h"
@@ -50,6 +66,19 @@
 #include "ieObjects/IERawDataEquipment.h"
 #include "ieObjects/IEStation.h"
 #include "ieObjects/IEStationEquations.h"
+=======
+#include "ieObjects/IEParcel.h"
+#include "ieObjects/IEPhotoNotes.h"
+#include "ieObjects/IEPoints.h"
+#include "ieObjects/IEPolyLines.h"
+#include "ieObjects/IERawData.h"
+#include "ieObjects/IERegion.h"
+#include "ieObjects/IEScanningSession.h"
+#include "ieObjects/IEStakeoutReports.h"
+#include "ieObjects/IEStation.h"
+#include "ieObjects/IESurface.h"
+#include "ieObjects/IETSRawData.h"
+>>>>>>> Stashed changes
 #include "ieObjects/IETextLabel.h"
 #include "ieObjects/IETimeMS.h"
 #include "ieObjects/IETypedValues.h"

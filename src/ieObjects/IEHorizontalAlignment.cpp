@@ -1,0 +1,14 @@
+#include "ieObjects/IEAlignmentPartsDictionary.h"
+
+namespace vyn::ie {
+
+// Out of line so that each class has one virtual table and type identity, in the library.
+IDexAlignmentStaEq::~IDexAlignmentStaEq() = default;
+
+IDexAlignmentPart::~IDexAlignmentPart() = default;
+
+DexHorizontalAlignment::DexHorizontalAlignment() = default;
+
+DexHorizontalAlignment::~DexHorizontalAlignment() = default;
+
+}  // namespace vyn::ie
