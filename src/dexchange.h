@@ -24,10 +24,7 @@
 #include "ieDefinitions/IEFormats.h"
 #include "ieDefinitions/IEFormatsData.h"
 #include "ieDefinitions/IEResult.h"
-<<<<<<< Updated upstream
-=======
 #include "ieObjects/IEAlignment.h"
->>>>>>> Stashed changes
 #include "ieObjects/IEAlignmentPartsDictionary.h"
 #include "ieObjects/IEArcs.h"
 #include "ieObjects/IECodesDataInterface.h"
@@ -38,17 +35,13 @@
 #include "ieObjects/IEDataset.h"
 #include "ieObjects/IEDatasetProperties.h"
 #include "ieObjects/IEDrawProperties.h"
-<<<<<<< Updated upstream
-#include "ieObjects/IEGPSAntennaSettings.h"
-#include "ieObjects/IEInterfaces.h"
-#include "ieObjects/IEJobInfo.h"
-=======
 #include "ieObjects/IEFindChainage.h"
+#include "ieObjects/IEGPSAntennaSettings.h"
 #include "ieObjects/IEGPSRawData.h"
 #include "ieObjects/IEInterfaces.h"
 #include "ieObjects/IEJobHistory.h"
 #include "ieObjects/IEJobHistoryRecords.h"
->>>>>>> Stashed changes
+#include "ieObjects/IEJobInfo.h"
 #include "ieObjects/IELayers.h"
 #include "ieObjects/IENoValue.h"
 #include "ieObjects/IEObjectBase.h"
@@ -58,27 +51,20 @@
 #include "ieObjects/IEOrientationJob.h"
 #include "ieObjects/IEOwnedPointer.h"
 #include "ieObjects/IEOwningList.h"
-<<<<<<< Updated upstream
 #include "ieObjects/IEOwningMap.h"
-#include "ieObjects/IEPhotoNotes.h"
-#include "ieObjects/IEPoints.h"
-#include "ieObjects/IEPolyLines.h"
-#include "ieObjects/IERawDataEquipment.h"
-#include "ieObjects/IEStation.h"
-#include "ieObjects/IEStationEquations.h"
-=======
 #include "ieObjects/IEParcel.h"
 #include "ieObjects/IEPhotoNotes.h"
 #include "ieObjects/IEPoints.h"
 #include "ieObjects/IEPolyLines.h"
 #include "ieObjects/IERawData.h"
+#include "ieObjects/IERawDataEquipment.h"
 #include "ieObjects/IERegion.h"
 #include "ieObjects/IEScanningSession.h"
 #include "ieObjects/IEStakeoutReports.h"
 #include "ieObjects/IEStation.h"
+#include "ieObjects/IEStationEquations.h"
 #include "ieObjects/IESurface.h"
 #include "ieObjects/IETSRawData.h"
->>>>>>> Stashed changes
 #include "ieObjects/IETextLabel.h"
 #include "ieObjects/IETimeMS.h"
 #include "ieObjects/IETypedValues.h"
