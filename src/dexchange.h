@@ -31,6 +31,7 @@
 #include "ieObjects/IECoords.h"
 #include "ieObjects/IECrossSections.h"
 #include "ieObjects/IEDLRawData.h"
+#include "ieObjects/IEData.h"
 #include "ieObjects/IEDataDictionary.h"
 #include "ieObjects/IEDataset.h"
 #include "ieObjects/IEDatasetProperties.h"
