@@ -7,6 +7,7 @@
 #include "hostlibs/VynArray.h"
 #include "hostlibs/VynString.h"
 #include "ieObjects/IEAlignmentPartsDictionary.h"
+#include "ieObjects/IEHorizontalAlignment.h"
 #include "ieObjects/IEDrawProperties.h"
 #include "ieObjects/IEInterfaces.h"
 #include "ieObjects/IEOwnedPointer.h"

@@ -7,6 +7,7 @@
 #include "hostlibs/VynLogging.h"
 #include "ieObjects/IEDataDictionary.h"
 #include "ieObjects/IEGPSRawData.h"
+#include "ieObjects/IEHorizontalAlignment.h"
 #include "ieObjects/detail/DatasetLog.h"
 #include "ieObjects/detail/DatasetObjects.h"
 

@@ -1,11 +1,9 @@
-#include "ieObjects/IEAlignmentPartsDictionary.h"
+#include "ieObjects/IEHorizontalAlignment.h"
 
 namespace vyn::ie {
 
 // Out of line so that each class has one virtual table and type identity, in the library.
 IDexAlignmentStaEq::~IDexAlignmentStaEq() = default;
-
-IDexAlignmentPart::~IDexAlignmentPart() = default;
 
 DexHorizontalAlignment::DexHorizontalAlignment() = default;
 

@@ -34,8 +34,8 @@ TEST(DexAlignment, FirstPartOfAKindIsThePrimaryOne) {
   DexAlignment alignment;
   alignment.setAlignmentPart(&first);
   alignment.setAlignmentPart(&second);
-  EXPECT_EQ(&first, alignment.getAlignmentPart(IDexAlignmentPart::HORIZONTAL_ALIGNMENT_PART));
-  EXPECT_EQ(nullptr, alignment.getAlignmentPart(IDexAlignmentPart::VERTICAL_ALIGNMENT_PART));
+  EXPECT_EQ(&first, alignment.getAlignmentPart(IDexAlignmentPart::HORIZONTAL_ALIGNMENT));
+  EXPECT_EQ(nullptr, alignment.getAlignmentPart(IDexAlignmentPart::VERTICAL_ALIGNMENT));
 }
 
 TEST(DexAlignment, NullPartsAndUnknownKindsAreReported) {
@@ -90,7 +90,7 @@ TEST(DexAlignment, CopySharesPartsAndDuplicatesDrawProperties) {
 
 TEST(DexHorizontalAlignment, IsAHorizontalPartInStateOne) {
   DexHorizontalAlignment alignment;
-  EXPECT_EQ(IDexAlignmentPart::HORIZONTAL_ALIGNMENT_PART, alignment.getType());
+  EXPECT_EQ(IDexAlignmentPart::HORIZONTAL_ALIGNMENT, alignment.getType());
   EXPECT_EQ(1, alignment.getStateType());
   EXPECT_EQ(nullptr, alignment.getStartPoint());
   alignment.setName(L"H1");

@@ -4,7 +4,7 @@
 
 #include <string>
 
-#include "ieObjects/IEAlignmentPartsDictionary.h"
+#include "ieObjects/IEHorizontalAlignment.h"
 #include "ieObjects/IEPoints.h"
 #include "ieObjects/detail/ParcelLog.h"
 #include "support/LogCapture.h"
