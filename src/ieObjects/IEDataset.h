@@ -52,8 +52,10 @@ class FreeNumericNames;
 //
 // Ownership: the dataset owns everything added to it (objects, list members, raw data, job history,
 // properties, the points-array vectors but not the points in them) and deletes it when it is reset or
-// destroyed. The observation information is shared: it lives while anything refers to it. Copy
-// construction and assignment copy only the name and the dataset properties, never the content.
+// destroyed. Each item is handed over once: the adds do not look for an item the dataset holds already
+// (that would cost a search of the list per add), and such an item would be deleted twice. The observation
+// information is shared: it lives while anything refers to it. Copy construction and assignment copy only the
+// name and the dataset properties, never the content.
 //
 // Name index. A dataset created with the name index files every object it is given, except sheet
 // points, under the name the object has when it is added; the first object of a name keeps the entry,
