@@ -2,8 +2,6 @@
 
 #include <map>
 #include <memory>
-#include <optional>
-#include <unordered_map>
 #include <vector>
 
 #include "hostlibs/DexApi.h"
@@ -42,6 +40,9 @@ class DexLayer;
 
 namespace utils {
 class FreeNumericNames;
+}
+namespace detail {
+class DatasetNameIndex;
 }
 
 // One named set of survey data: the survey objects in insertion order, and lists of surfaces,
@@ -303,8 +304,6 @@ class DEX_API DexDataset : public IDexNameInterface {
                                                            vyn_vector<const DexDesignPoint*>& out) const;
 
  private:
-  using NameIndex = std::unordered_map<CVynStringT<wchar_t>, DexObject*>;
-
   void fileInNameIndex(DexObject* object);
   void takeOutOfNameIndex(DexObject* object);
   const DexObject* findObjectInList(const CVynStringT<wchar_t>& name, int kind) const;
@@ -329,7 +328,7 @@ class DEX_API DexDataset : public IDexNameInterface {
   DexOwningList<DexFieldReport> fieldReports_;
   DexOwningList<DexRegion> regions_;
   std::shared_ptr<DexObservationInfo> observationInfo_;
-  std::optional<NameIndex> nameIndex_;
+  std::unique_ptr<detail::DatasetNameIndex> nameIndex_;
   bool codesExist_ = false;
   bool objectWithoutCodes_ = false;
 };
