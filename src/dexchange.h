@@ -39,6 +39,7 @@
 #include "ieObjects/IEFindChainage.h"
 #include "ieObjects/IEGPSAntennaSettings.h"
 #include "ieObjects/IEGPSRawData.h"
+#include "ieObjects/IEHorizontalAlignment.h"
 #include "ieObjects/IEInterfaces.h"
 #include "ieObjects/IEJobHistory.h"
 #include "ieObjects/IEJobHistoryRecords.h"

@@ -7,8 +7,8 @@
 #include "hostlibs/VynArray.h"
 #include "hostlibs/VynString.h"
 #include "ieObjects/IEAlignmentPartsDictionary.h"
-#include "ieObjects/IEHorizontalAlignment.h"
 #include "ieObjects/IEDrawProperties.h"
+#include "ieObjects/IEHorizontalAlignment.h"
 #include "ieObjects/IEInterfaces.h"
 #include "ieObjects/IEOwnedPointer.h"
 

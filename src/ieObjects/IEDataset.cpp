@@ -9,6 +9,7 @@
 #include "ieObjects/IEGPSRawData.h"
 #include "ieObjects/IEHorizontalAlignment.h"
 #include "ieObjects/detail/DatasetLog.h"
+#include "ieObjects/detail/DatasetNameIndex.h"
 #include "ieObjects/detail/DatasetObjects.h"
 
 namespace vyn::ie {
@@ -32,7 +33,7 @@ DexDataset::DexDataset(const CVynStringT<wchar_t>& name, int numberOfSlots, bool
   const std::size_t slots = numberOfSlots > 0 ? static_cast<std::size_t>(numberOfSlots) : 0;
   objects_.reserve(std::max<std::size_t>(slots, kReservedObjects));
   objects_.resize(slots);
-  if (withNameIndex) nameIndex_.emplace();
+  if (withNameIndex) nameIndex_ = std::make_unique<detail::DatasetNameIndex>();
 }
 
 DexDataset::DexDataset(const DexDataset& other)
@@ -95,26 +96,19 @@ DexDatasetProperties* DexDataset::getDatasetProperties() {
 
 void DexDataset::fileInNameIndex(DexObject* object) {
   if (!nameIndex_ || object->getType() == OBJECT_TYPE_SHEET_POINT) return;
-  nameIndex_->try_emplace(object->getName(), object);
+  nameIndex_->fileFirst(object->getName().view(), object);
 }
 
-// The entry is looked up under the object's name and, when another object holds that name (a
-// duplicate) or the object was renamed since it was filed, among all entries: an entry must never
-// outlive its object. The entry's name then passes to the first object left in the list that has it.
+// An entry must never outlive its object, even when the object was renamed since it was filed. The
+// entry's name then passes to the first object left in the list that has it.
 void DexDataset::takeOutOfNameIndex(DexObject* object) {
   if (!nameIndex_ || object == nullptr) return;
-  auto entry = nameIndex_->find(object->getName());
-  if (entry == nameIndex_->end() || entry->second != object) {
-    entry = std::find_if(nameIndex_->begin(), nameIndex_->end(),
-                         [object](const NameIndex::value_type& filed) { return filed.second == object; });
-    if (entry == nameIndex_->end()) return;
-  }
-  const CVynStringT<wchar_t> name = entry->first;
-  nameIndex_->erase(entry);
+  std::wstring name;
+  if (!nameIndex_->remove(object->getName().view(), object, name)) return;
   for (const std::unique_ptr<DexObject>& candidate : objects_) {
     if (candidate != nullptr && candidate->getType() != OBJECT_TYPE_SHEET_POINT &&
-        candidate->getName() == name) {
-      nameIndex_->emplace(name, candidate.get());
+        candidate->getName().view() == name) {
+      nameIndex_->fileFirst(name, candidate.get());
       return;
     }
   }
@@ -138,8 +132,7 @@ DexObject* DexDataset::findObject(const CVynStringT<wchar_t>& name, int kind) {
 
 const DexObject* DexDataset::findObject(const CVynStringT<wchar_t>& name, int kind) const {
   if (nameIndex_ && kind != OBJECT_TYPE_SHEET_POINT) {
-    const auto found = nameIndex_->find(name);
-    return found != nameIndex_->end() ? found->second : nullptr;
+    return nameIndex_->find(name.view());
   }
   return findObjectInList(name, kind);
 }
@@ -217,11 +210,14 @@ bool DexDataset::removeObject(int index) {
 }
 
 void DexDataset::resetAllData() {
+  const bool indexed = nameIndex_ != nullptr;
   clearContent();
+  // A new index rather than an emptied one: it hands the memory of the old one back.
+  if (indexed) nameIndex_ = std::make_unique<detail::DatasetNameIndex>();
 }
 
 void DexDataset::clearContent() noexcept {
-  if (nameIndex_) nameIndex_->clear();
+  nameIndex_.reset();
   datasetProperties_.reset();
   objects_.clear();
   surfaces_.clear();

@@ -2,8 +2,6 @@
 
 #include <map>
 #include <memory>
-#include <optional>
-#include <unordered_map>
 #include <vector>
 
 #include "hostlibs/DexApi.h"
@@ -43,6 +41,9 @@ class DexLayer;
 namespace utils {
 class FreeNumericNames;
 }
+namespace detail {
+class DatasetNameIndex;
+}
 
 // One named set of survey data: the survey objects in insertion order, and lists of surfaces,
 // alignments, parcels, regions, object lists, surveyed cross sections, chainage reports, scanning
@@ -52,8 +53,10 @@ class FreeNumericNames;
 //
 // Ownership: the dataset owns everything added to it (objects, list members, raw data, job history,
 // properties, the points-array vectors but not the points in them) and deletes it when it is reset or
-// destroyed. The observation information is shared: it lives while anything refers to it. Copy
-// construction and assignment copy only the name and the dataset properties, never the content.
+// destroyed. Each item is handed over once: the adds do not look for an item the dataset holds already
+// (that would cost a search of the list per add), and such an item would be deleted twice. The observation
+// information is shared: it lives while anything refers to it. Copy construction and assignment copy only the
+// name and the dataset properties, never the content.
 //
 // Name index. A dataset created with the name index files every object it is given, except sheet
 // points, under the name the object has when it is added; the first object of a name keeps the entry,
@@ -301,8 +304,6 @@ class DEX_API DexDataset : public IDexNameInterface {
                                                            vyn_vector<const DexDesignPoint*>& out) const;
 
  private:
-  using NameIndex = std::unordered_map<CVynStringT<wchar_t>, DexObject*>;
-
   void fileInNameIndex(DexObject* object);
   void takeOutOfNameIndex(DexObject* object);
   const DexObject* findObjectInList(const CVynStringT<wchar_t>& name, int kind) const;
@@ -327,7 +328,7 @@ class DEX_API DexDataset : public IDexNameInterface {
   DexOwningList<DexFieldReport> fieldReports_;
   DexOwningList<DexRegion> regions_;
   std::shared_ptr<DexObservationInfo> observationInfo_;
-  std::optional<NameIndex> nameIndex_;
+  std::unique_ptr<detail::DatasetNameIndex> nameIndex_;
   bool codesExist_ = false;
   bool objectWithoutCodes_ = false;
 };

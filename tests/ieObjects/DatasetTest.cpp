@@ -717,10 +717,8 @@ TEST(DexDataset, FindsAlignmentsByNameAndByPartName) {
 
   EXPECT_EQ(first, dataset.findAlignment(L"ROAD"));
   EXPECT_EQ(nullptr, dataset.findAlignment(L"road"));
-  EXPECT_EQ(second,
-            dataset.findAlignmentByPartName(L"H2", vyn::ie::IDexAlignmentPart::HORIZONTAL_ALIGNMENT));
-  EXPECT_EQ(nullptr,
-            dataset.findAlignmentByPartName(L"H2", vyn::ie::IDexAlignmentPart::VERTICAL_ALIGNMENT));
+  EXPECT_EQ(second, dataset.findAlignmentByPartName(L"H2", vyn::ie::IDexAlignmentPart::HORIZONTAL_ALIGNMENT));
+  EXPECT_EQ(nullptr, dataset.findAlignmentByPartName(L"H2", vyn::ie::IDexAlignmentPart::VERTICAL_ALIGNMENT));
 
   const dex_test::LogCapture log;
   EXPECT_EQ(nullptr, dataset.findAlignmentByPartName(L"H1", 4));

@@ -102,6 +102,19 @@ TEST(DexSurface, SamePositionTwiceGivesTwoIndexesOneReportAndFindsTheFirst) {
   EXPECT_EQ(1, surface.getPositionIndex(DexPosition3D(1, 2, 3)));
 }
 
+TEST(DexSurface, TenThousandIdenticalPositionsAreStoredWithOneReportEachAfterTheFirst) {
+  const dex_test::LogCapture log;
+  DexSurface surface;
+  for (int i = 0; i < 10000; ++i)
+    ASSERT_EQ(i, surface.addPosition(DexPosition3D(12.5, -3.25, 7.0)));
+
+  EXPECT_EQ(10000, surface.getNumberOfPositions());
+  EXPECT_EQ(9999, log.count(kSource, detail::kSurfaceDuplicatePositionLine));
+  EXPECT_EQ(9999u, log.size());
+  EXPECT_EQ(0, surface.getPositionIndex(DexPosition3D(12.5, -3.25, 7.0)));
+  EXPECT_EQ(-1, surface.getPositionIndex(DexPosition3D(12.5, -3.25, 7.5)));
+}
+
 TEST(DexSurface, NonFinitePositionsAreStoredAndReportedButNotIndexed) {
   const dex_test::LogCapture log;
   DexSurface surface;
@@ -312,6 +325,43 @@ TEST(PositionOctree, CapacityOfZeroOrLessIsReportedAndReplaced) {
   EXPECT_EQ(PositionOctree::kDefaultCapacity, zero.capacity());
   EXPECT_EQ(PositionOctree::kDefaultCapacity, negative.capacity());
   EXPECT_EQ(2u, log.size());
+}
+
+TEST(PositionOctree, SurfaceLeavesHoldSixteenPointsAndSplitOnTheSeventeenth) {
+  EXPECT_EQ(16, DexSurface::kPositionIndexCapacity);
+  PositionOctree index(DexSurface::kPositionIndexCapacity);
+  for (int i = 0; i < 16; ++i)
+    ASSERT_EQ(PositionOctree::InsertResult::kInserted, index.insert(i / 32.0, 0.5, 0.5, i));
+  EXPECT_EQ(1, index.depth());
+
+  ASSERT_EQ(PositionOctree::InsertResult::kInserted, index.insert(-0.5, -0.5, -0.5, 16));
+  EXPECT_EQ(2, index.depth());
+  for (int i = 0; i < 16; ++i)
+    EXPECT_EQ(i, index.find(i / 32.0, 0.5, 0.5));
+  EXPECT_EQ(16, index.find(-0.5, -0.5, -0.5));
+}
+
+TEST(PositionOctree, PointsOnTheBordersOfTheRootAreHeldAfterItGrows) {
+  PositionOctree index;
+  const std::vector<std::array<double, 3>> points = {{0.5, 0.5, 0.5}, {1.0, 0.0, 0.0},  {-2.0, -2.0, -2.0},
+                                                     {2.0, 2.0, 2.0}, {-4.0, 4.0, 0.0}, {0.0, -1.0, 1.0}};
+  int value = 0;
+  for (const auto& point : points)
+    ASSERT_EQ(PositionOctree::InsertResult::kInserted, index.insert(point[0], point[1], point[2], value++));
+  for (std::size_t i = 0; i < points.size(); ++i)
+    EXPECT_EQ(static_cast<int>(i), index.find(points[i][0], points[i][1], points[i][2])) << "point " << i;
+  EXPECT_EQ(-1, index.find(8.0, 8.0, 8.0));
+  EXPECT_EQ(-1, index.find(-0.5, -0.5, -0.5));
+}
+
+TEST(PositionOctree, RefusedFirstPointsLeaveTheIndexEmpty) {
+  PositionOctree index;
+  EXPECT_EQ(PositionOctree::InsertResult::kNotFinite, index.insert(kInfinity, 0, 0, 0));
+  EXPECT_EQ(PositionOctree::InsertResult::kOutOfReach, index.insert(-0x1p1023, 0, 0, 1));
+  EXPECT_TRUE(index.isEmpty());
+  EXPECT_EQ(0, index.depth());
+  EXPECT_EQ(PositionOctree::InsertResult::kInserted, index.insert(0x1p1022, -0x1p1022, 0, 2));
+  EXPECT_EQ(2, index.find(0x1p1022, -0x1p1022, 0));
 }
 
 TEST(PositionOctree, SaysWhyItRefusesAPoint) {
