@@ -6,6 +6,7 @@ FUZZ_DIR     ?= build-fuzz
 PREFIX       ?= /usr/local
 JOBS         ?= 2
 FUZZ_SECONDS ?= 60
+FUZZ_TARGETS ?=
 CMAKE_ARGS   ?=
 
 DEXCHANGE := $(BUILD_DIR)/tools/dexchange/dexchange
@@ -51,6 +52,18 @@ install: build
 bench: deps
 	cmake -S . -B $(BUILD_DIR) -DDEXCHANGE_BENCH=ON $(CMAKE_ARGS)
 	cmake --build $(BUILD_DIR) -j$(JOBS)
+
+# The libFuzzer programs (clang), each run for FUZZ_SECONDS; FUZZ_TARGETS picks some (default: all).
+fuzz:
+	@DEXCHANGE_FUZZ=ON scripts/deps.sh
+	cmake -S . -B $(FUZZ_DIR) -DCMAKE_BUILD_TYPE=RelWithDebInfo -DCMAKE_CXX_COMPILER=clang++ \
+		-DDEXCHANGE_FUZZ=ON -DDEXCHANGE_TESTS=OFF $(CMAKE_ARGS)
+	cmake --build $(FUZZ_DIR) -j$(JOBS) --target dexchange_fuzzers
+	scripts/fuzz.sh $(FUZZ_DIR) $(FUZZ_SECONDS) $(FUZZ_TARGETS)
+
+# The whole suite once more under a locale whose decimal separator is a comma.
+locale-test: build
+	scripts/locale-test.sh $(BUILD_DIR) $(JOBS)
 
 format:
 	git ls-files '*.h' '*.cpp' | xargs clang-format -i

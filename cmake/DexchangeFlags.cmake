@@ -21,3 +21,15 @@ if(DEXCHANGE_TSAN)
   add_compile_options(${DEXCHANGE_TSAN_FLAGS})
   add_link_options(${DEXCHANGE_TSAN_FLAGS})
 endif()
+
+# Fuzzing instruments the whole library for coverage and runs it under the sanitizers; the fuzz
+# programs themselves link libFuzzer (fuzz/CMakeLists.txt).
+if(DEXCHANGE_FUZZ)
+  if(NOT CMAKE_CXX_COMPILER_ID MATCHES "Clang")
+    message(FATAL_ERROR "DEXCHANGE_FUZZ=ON needs clang: configure with -DCMAKE_CXX_COMPILER=clang++")
+  endif()
+  set(DEXCHANGE_FUZZ_FLAGS -fsanitize=fuzzer-no-link,address,undefined -fno-omit-frame-pointer
+      -fno-sanitize-recover=undefined)
+  add_compile_options(${DEXCHANGE_FUZZ_FLAGS})
+  add_link_options(-fsanitize=address,undefined)
+endif()

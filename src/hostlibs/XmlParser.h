@@ -33,6 +33,11 @@ class XmlTokenReader;
 // libxml2 parses a block of a few hundred bytes ahead of the tokens it hands out, so a fault in the
 // first block makes DoInitialize answer INIT_NOT_XML, and the last tokens before a later fault may be
 // missing. Text of an element left open by a fault is dropped.
+//
+// Limits, so that a hostile file costs bounded time and memory: nesting deeper than 256 elements, a
+// name longer than 50,000 bytes, and a text (joined across comments) or attribute value longer than
+// 10,000,000 characters are faults like any other. A 100 MB attribute thus ends reading after about
+// 10 MB, and a document nested 10,000 deep gives at most its first 256 start tags and then nothing.
 class DEX_API CXmlParserBase {
  public:
   VYN_CLASS_ALLOCATOR

@@ -476,3 +476,65 @@ TEST(CXmlParserWriters, WriteWhatTheReaderGivesBack) {
 }
 
 }  // namespace
+
+namespace {
+
+// --- Limits
+
+TEST(CXmlParserLimits, GivesAtMostTheFirst256LevelsOfADocumentNested10000Deep) {
+  constexpr std::size_t kLevels = 10000;
+  constexpr std::size_t kDeepestNesting = 256;
+  const dex_test::TempDir dir;
+  std::string closing;
+  for (std::size_t i = 0; i < kLevels; ++i)
+    closing += "</a>";
+  const std::string path =
+      dir.writeRepeated("deep.xml", "<?xml version=\"1.0\"?>", "<a x=\"1\">", kLevels, "text" + closing);
+  CXmlParser parser;
+  ASSERT_EQ(initialize(path, parser), CXmlParserBase::INIT_OK);
+  const std::vector<Token> tokens = readAll(parser);
+  // The declaration and start tags; libxml2's read-ahead loses the last few before the fault.
+  ASSERT_LE(tokens.size(), 1 + kDeepestNesting);
+  ASSERT_GE(tokens.size(), 1 + kDeepestNesting / 2);
+  for (std::size_t i = 1; i < tokens.size(); ++i)
+    EXPECT_EQ(tokens[i], (Token{L"a", L"x=\"1\"", L""}));
+  String tag, attributes, value;
+  EXPECT_FALSE(parser.ReadToken(tag, attributes, value));
+}
+
+TEST(CXmlParserLimits, RefusesAnAttributeOfAHundredMegabytes) {
+  const dex_test::TempDir dir;
+  const std::string path = dir.writeRepeated("huge-attribute.xml", "<?xml version=\"1.0\"?><r a=\"",
+                                             std::string(1 << 20, 'x'), 100, "\" b=\"2\"><p/></r>");
+  CXmlParser parser;
+  EXPECT_EQ(initialize(path, parser), CXmlParserBase::INIT_NOT_XML);
+  EXPECT_FALSE(parser.IsOpen());
+}
+
+TEST(CXmlParserLimits, EndsTheStreamAtAnAttributeOfAHundredMegabytesAfterAGoodStart) {
+  const dex_test::TempDir dir;
+  const std::string path =
+      dir.writeRepeated("late-huge-attribute.xml", "<r>" + std::string(4096, ' ') + "<p a=\"1\"/><q a=\"",
+                        std::string(1 << 20, 'y'), 100, "\"/></r>");
+  CXmlParser parser;
+  ASSERT_EQ(initialize(path, parser), CXmlParserBase::INIT_OK);
+  const std::vector<Token> tokens = readAll(parser);
+  EXPECT_LE(tokens.size(), 3u);
+  for (const Token& token : tokens)
+    EXPECT_NE(token.tag, L"q");
+}
+
+TEST(CXmlParserLimits, EndsTheStreamAtTextOfMoreThanTenMillionCharactersSplitByComments) {
+  const dex_test::TempDir dir;
+  const std::string path = dir.writeRepeated("long-text.xml", "<r><p>short</p><q>",
+                                             std::string(1 << 20, 'z') + "<!-- -->", 11, "</q></r>");
+  CXmlParser parser;
+  ASSERT_EQ(initialize(path, parser), CXmlParserBase::INIT_OK);
+  const std::vector<Token> tokens = readAll(parser);
+  EXPECT_EQ(
+      tokens,
+      (std::vector<Token>{
+          {L"r", L"", L""}, {L"p", L"", L""}, {L"p", L"", L"short"}, {L"/p", L"", L""}, {L"q", L"", L""}}));
+}
+
+}  // namespace

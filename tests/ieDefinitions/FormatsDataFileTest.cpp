@@ -568,3 +568,35 @@ TEST(FormatsDataFile, ATruncatedFileGivesTheFormatsReadCompletelyBeforeTheCut) {
     EXPECT_EQ(bytes, dex_test::readFile(path));
   }
 }
+
+// ---- Hostile files --------------------------------------------------------------------------------
+
+TEST(FormatsDataFile, AFormatNested10000DeepIsDroppedAndTheBuiltInTableServes) {
+  const dex_test::TempDir folder;
+  std::string closing;
+  for (int i = 0; i < 10000; ++i)
+    closing += "</Extra>";
+  const std::string path = folder.writeRepeated(
+      "deep.xml",
+      "<?xml version=\"1.0\" encoding=\"utf-8\"?><IEFormatsData version=\"1.9\" useDataFromFile=\"true\">"
+      "<IEFormats><IEFormat guid=\"{E653FE2B-C46A-400E-BA60-864A221BE19F}\" name=\"Deep\">",
+      "<Extra>", 10000, closing + "</IEFormat></IEFormats></IEFormatsData>");
+  const dex_test::LogCapture log;
+  const std::unique_ptr<DexFormatsData> data = startFrom(path);
+  EXPECT_TRUE(holdsTheBuiltInTable(*data));
+  EXPECT_TRUE(isWrittenBuiltInTable(path));
+  EXPECT_EQ(1, log.count(kSource, 2486));  // the unknown child, whose skipping ends with the stream
+}
+
+TEST(FormatsDataFile, AHundredMegabyteAttributeIsRefusedAndTheBuiltInTableServes) {
+  const dex_test::TempDir folder;
+  const std::string path = folder.writeRepeated(
+      "huge.xml",
+      "<?xml version=\"1.0\" encoding=\"utf-8\"?><IEFormatsData version=\"1.9\" useDataFromFile=\"true\">"
+      "<IEFormats><IEFormat guid=\"{E653FE2B-C46A-400E-BA60-864A221BE19F}\" name=\"",
+      std::string(1 << 20, 'N'), 100,
+      "\"><DataTypes><POINTS/></DataTypes></IEFormat></IEFormats></IEFormatsData>");
+  const std::unique_ptr<DexFormatsData> data = startFrom(path);
+  EXPECT_TRUE(holdsTheBuiltInTable(*data));
+  EXPECT_TRUE(isWrittenBuiltInTable(path));
+}

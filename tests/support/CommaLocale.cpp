@@ -89,17 +89,26 @@ CommaLocale::CommaLocale() {
   for (const char* candidate : kInstalledCandidates) {
     if (activate(candidate)) {
       name_ = candidate;
+      locale_ = candidate;
       active_ = true;
       return;
     }
   }
   if (activateCompiled()) {
     name_ = std::string(kCompiledName) + " (compiled)";
+    locale_ = kCompiledName;
+    folder_ = *compiledLocaleFolder();
     active_ = true;
     return;
   }
   std::setlocale(LC_ALL, previous_.c_str());
   reason_ = "no locale with a decimal comma is installed and localedef could not compile de_DE.UTF-8";
+}
+
+std::string CommaLocale::environment() const {
+  if (!active_) return {};
+  const std::string locale = "LC_ALL='" + locale_ + "'";
+  return folder_.empty() ? locale : "LOCPATH='" + folder_ + "' " + locale;
 }
 
 CommaLocale::~CommaLocale() {

@@ -21,10 +21,15 @@ class CommaLocale {
   bool active() const { return active_; }
   const std::string& name() const { return name_; }
   const std::string& reason() const { return reason_; }
+  // What a child process needs to run under the same locale: "LC_ALL=<locale>", preceded by
+  // "LOCPATH=<folder> " when the locale was compiled into the build tree. Empty when not active.
+  std::string environment() const;
 
  private:
   std::string previous_;
   std::string name_;
+  std::string locale_;  // the name setlocale took
+  std::string folder_;  // LOCPATH of a compiled locale, else empty
   std::string reason_;
   bool active_ = false;
 };

@@ -38,6 +38,17 @@ std::string TempDir::write(std::string_view name, std::string_view bytes) const 
   return target;
 }
 
+std::string TempDir::writeRepeated(std::string_view name, std::string_view head, std::string_view block,
+                                   std::size_t count, std::string_view tail) const {
+  const std::string target = file(name);
+  std::ofstream out(target, std::ios::binary);
+  out << head;
+  for (std::size_t i = 0; i < count; ++i)
+    out << block;
+  out << tail;
+  return target;
+}
+
 std::string readFile(const std::string& path) {
   std::ifstream in(path, std::ios::binary);
   return std::string(std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>());

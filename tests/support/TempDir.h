@@ -1,5 +1,6 @@
 #pragma once
 
+#include <cstddef>
 #include <string>
 #include <string_view>
 
@@ -20,6 +21,10 @@ class TempDir {
   std::wstring wfile(std::string_view name) const;
   // Writes the bytes to a file in the folder and returns its path.
   std::string write(std::string_view name, std::string_view bytes) const;
+  // Writes head, count copies of block, then tail, piece by piece (for files of hundreds of megabytes
+  // without holding them in memory), and returns the path.
+  std::string writeRepeated(std::string_view name, std::string_view head, std::string_view block,
+                            std::size_t count, std::string_view tail) const;
 
  private:
   std::string path_;

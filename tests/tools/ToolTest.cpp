@@ -4,6 +4,8 @@
 #include <cstdio>
 #include <string>
 
+#include "support/CommaLocale.h"
+
 namespace {
 
 struct ToolRun {
@@ -11,9 +13,11 @@ struct ToolRun {
   std::string output;  // stdout and stderr together
 };
 
-ToolRun runTool(const std::string& arguments) {
+// Runs the tool with arguments; environment, when given, holds NAME=value assignments for it.
+ToolRun runTool(const std::string& arguments, const std::string& environment = "") {
   ToolRun run;
-  const std::string command = std::string(DEXCHANGE_TOOL_PATH) + " " + arguments + " 2>&1";
+  const std::string prefix = environment.empty() ? std::string() : "env " + environment + " ";
+  const std::string command = prefix + std::string(DEXCHANGE_TOOL_PATH) + " " + arguments + " 2>&1";
   FILE* pipe = ::popen(command.c_str(), "r");
   if (pipe == nullptr) return run;
   std::array<char, 512> chunk{};
@@ -55,4 +59,18 @@ TEST(Tool, WrongCommandLinesFailWithOneLine) {
 
   const ToolRun extra = runTool("version extra");
   EXPECT_EQ(2, extra.exitCode);
+}
+
+// The tool takes the user's locale, as a host application does; what it prints must not change.
+TEST(Tool, PrintsTheSameUnderACommaDecimalLocale) {
+  const dex_test::CommaLocale comma;  // compiles the locale into the build tree when none is installed
+  if (!comma.active()) GTEST_SKIP() << comma.reason();
+  for (const char* arguments :
+       {"--help", "--version", "version --help", "frobnicate", "formats", "formats --json",
+        "formats --export --type POINTS --json", "formats --help"}) {
+    const ToolRun plain = runTool(arguments, "LC_ALL=C");
+    const ToolRun commaRun = runTool(arguments, comma.environment());
+    EXPECT_EQ(commaRun.exitCode, plain.exitCode) << arguments;
+    EXPECT_EQ(commaRun.output, plain.output) << arguments;
+  }
 }

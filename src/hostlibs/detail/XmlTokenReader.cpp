@@ -7,6 +7,7 @@
 
 #include <libxml/globals.h>
 #include <libxml/parser.h>
+#include <libxml/parserInternals.h>
 #include <libxml/xmlerror.h>
 #include <libxml/xmlreader.h>
 
@@ -20,6 +21,10 @@ namespace {
 // No network, no DTD, no entity substitution (which would also load external entities); libxml2's
 // own reports are off.
 constexpr int kParseOptions = XML_PARSE_NONET | XML_PARSE_NOERROR | XML_PARSE_NOWARNING;
+
+// libxml2 refuses a single text node longer than this; text that comments split into several nodes
+// is joined into one token here, so the same cap applies to the joined text.
+constexpr std::size_t kLongestText = XML_MAX_TEXT_LENGTH;
 
 void ensureLibxmlInitialized() {
   static std::once_flag once;
@@ -124,6 +129,10 @@ bool XmlTokenReader::step() {
     case XML_READER_TYPE_WHITESPACE:
     case XML_READER_TYPE_SIGNIFICANT_WHITESPACE:
       appendUtf8(text_, reinterpret_cast<const char*>(xmlTextReaderConstValue(reader_.get())));
+      if (text_.size() > kLongestText) {
+        finish();  // a fault like libxml2's own for one overlong text node
+        return false;
+      }
       break;
     default:  // comments, processing instructions, the document type, entity references
       break;

@@ -12,8 +12,11 @@ struct _xmlTextReader;
 
 // The token stream of an XML file over libxml2's streaming reader. libxml2 reads the file in blocks
 // and keeps only the current node, so files of any size are read in bounded memory; its default limits
-// (nesting depth, name and text sizes, entity expansion) stay in force. No DTD or external entity is
-// ever loaded and nothing is fetched from the network; libxml2's messages are swallowed.
+// stay in force (XML_PARSE_HUGE is never set): nesting deeper than 256 elements, a name longer than
+// 50,000 bytes and a text or attribute value longer than 10,000,000 bytes are faults. Text that
+// comments split into several nodes is held to the same 10,000,000 characters once joined. No DTD or
+// external entity is ever loaded and nothing is fetched from the network; libxml2's messages are
+// swallowed.
 namespace vyn_text::detail {
 
 struct XmlToken {

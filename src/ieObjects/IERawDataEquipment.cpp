@@ -1,0 +1,7 @@
+#include "ieObjects/IERawDataEquipment.h"
+
+namespace vyn::ie {
+
+DexRawDataEquipment::~DexRawDataEquipment() = default;
+
+}  // namespace vyn::ie
