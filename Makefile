@@ -1,6 +1,7 @@
 # Thin wrapper over CMake. The README's quick start is `make demo` and `make test`.
 BUILD_DIR    ?= build
 SANITIZE_DIR ?= build-sanitize
+TSAN_DIR     ?= build-tsan
 FUZZ_DIR     ?= build-fuzz
 PREFIX       ?= /usr/local
 JOBS         ?= 2
@@ -10,7 +11,7 @@ CMAKE_ARGS   ?=
 
 DEXCHANGE := $(BUILD_DIR)/tools/dexchange/dexchange
 
-.PHONY: all deps configure build demo test sanitize install bench fuzz locale-test format tidy clean
+.PHONY: all deps configure build demo test sanitize tsan install bench fuzz locale-test format tidy clean
 
 all: build
 
@@ -36,6 +37,14 @@ sanitize: deps
 	cmake --build $(SANITIZE_DIR) -j$(JOBS)
 	ASAN_OPTIONS=detect_leaks=1:abort_on_error=1 UBSAN_OPTIONS=print_stacktrace=1:halt_on_error=1 \
 		ctest --test-dir $(SANITIZE_DIR) --output-on-failure -j$(JOBS)
+
+# The runs in worker threads under ThreadSanitizer: the loader's and the run functions' tests.
+TSAN_TESTS ?= ParsersLoader|ImporterExporter|RunProgress
+tsan: deps
+	cmake -S . -B $(TSAN_DIR) -DCMAKE_BUILD_TYPE=Debug -DDEXCHANGE_TSAN=ON $(CMAKE_ARGS)
+	cmake --build $(TSAN_DIR) -j$(JOBS) --target dexchange_ieUtils_tests
+	TSAN_OPTIONS=halt_on_error=1:second_deadlock_stack=1 \
+		ctest --test-dir $(TSAN_DIR) --output-on-failure -j$(JOBS) -R '$(TSAN_TESTS)'
 
 install: build
 	cmake --install $(BUILD_DIR) --prefix $(PREFIX)
@@ -63,4 +72,4 @@ tidy: configure
 	git ls-files 'src/*.cpp' 'tools/*.cpp' 'plugins/*.cpp' | xargs clang-tidy -p $(BUILD_DIR) --quiet
 
 clean:
-	rm -rf $(BUILD_DIR) $(SANITIZE_DIR) $(FUZZ_DIR)
+	rm -rf $(BUILD_DIR) $(SANITIZE_DIR) $(TSAN_DIR) $(FUZZ_DIR)

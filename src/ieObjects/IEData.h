@@ -23,6 +23,7 @@
 #include "ieObjects/IERawDataEquipment.h"
 #include "ieObjects/IEStationEquations.h"
 #include "ieUtils/IELocalization.h"
+#include "ieUtils/IERunProgress.h"
 #include "ieUtils/IESettings.h"
 #include "ieUtils/IEUtilsStringArray.h"
 #include "ieUtils/IEUtilsUnits.h"
@@ -60,7 +61,8 @@ using TCoordInd = int;
 // the references to the observation information, the list of exported files, the job information and
 // the settings. Alignments in the datasets may thus refer to parts of the dictionaries until the end.
 //
-// Not copyable. One run uses one data at a time; only stopProcess_ may be touched from another thread.
+// Not copyable. One run uses one data at a time; only stopProcess_ and the progress record may be
+// touched from another thread.
 class DEX_API DexData {
  public:
   VYN_CLASS_ALLOCATOR
@@ -241,6 +243,12 @@ class DEX_API DexData {
   // Empties the list, for a data reused by another export.
   void clearExportedFileNames() { exportedFileNames_.RemoveAll(); }
 
+  // ---- Run progress ---------------------------------------------------------------------------
+  // How far the run working on this data has come: importers and the export driver publish to it,
+  // and the host may poll it from another thread while the run works.
+  DexRunProgress& getProgress() noexcept { return progress_; }
+  const DexRunProgress& getProgress() const noexcept { return progress_; }
+
   // ---- Numeric names --------------------------------------------------------------------------
   // When the settings hold a highest numeric point name (maxNumericPointName not -1), hands it to
   // names.addObject and calls names.init(); otherwise names stay untouched.
@@ -277,6 +285,7 @@ class DEX_API DexData {
   DexOwnedPointer<DexDataDictionary> dataDictionary_;
   DexOwningList<DexDataset> datasets_;
   int curDatasetId_ = 0;
+  DexRunProgress progress_;
 };
 
 }  // namespace vyn::ie
