@@ -8,4 +8,3 @@ DEX_MAKE_EXPORTER(data, fileName, format) {
   if (data == nullptr || !vyn::ie::point_files::isPointFileFormat(format)) return nullptr;
   return new vyn::ie::point_files::PointFileExporter(data, fileName, format);
 }
-

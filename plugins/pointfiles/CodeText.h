@@ -44,7 +44,9 @@ class CodeReader {
  private:
   struct Hash {
     using is_transparent = void;
-    std::size_t operator()(std::wstring_view text) const noexcept { return std::hash<std::wstring_view>{}(text); }
+    std::size_t operator()(std::wstring_view text) const noexcept {
+      return std::hash<std::wstring_view>{}(text);
+    }
   };
   struct Equal {
     using is_transparent = void;

@@ -24,7 +24,8 @@ std::wstring_view trimmed(std::wstring_view text) {
 
 }  // namespace
 
-LineSplitter::LineSplitter(const PointLayout& layout) : layout_(layout), fixedLayout_(toAsciiSettings(layout)) {}
+LineSplitter::LineSplitter(const PointLayout& layout)
+    : layout_(layout), fixedLayout_(toAsciiSettings(layout)) {}
 
 const std::vector<std::wstring_view>& LineSplitter::split(const CVynStringT<wchar_t>& line) {
   text_.clear();

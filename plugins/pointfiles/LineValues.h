@@ -31,7 +31,7 @@ class LineSplitter {
   const PointLayout& layout_;
   const DexUserAsciiSettingsData fixedLayout_;
   CVynArray<CVynStringT<wchar_t>, const CVynStringT<wchar_t>&> fixedValues_;
-  std::wstring text_;                                    // the values one after another
+  std::wstring text_;                                       // the values one after another
   std::vector<std::pair<std::size_t, std::size_t>> spans_;  // offset and length of each in text_
   std::vector<std::wstring_view> values_;
 };

@@ -39,13 +39,15 @@ void appendUtf8(std::wstring_view text, std::string& out) {
 
 bool needsQuotes(std::wstring_view value, wchar_t delimiter) {
   if (value.empty()) return false;
-  if (value.front() == L' ' || value.back() == L' ' || value.front() == L'\t' || value.back() == L'\t') return true;
+  if (value.front() == L' ' || value.back() == L' ' || value.front() == L'\t' || value.back() == L'\t')
+    return true;
   return value.find_first_of(std::wstring{delimiter, kQuote, L'\r', L'\n'}) != std::wstring_view::npos;
 }
 
 }  // namespace
 
-PointFileExporter::PointFileExporter(DexData* data, const CVynStringT<wchar_t>& fileName, const DexFormat* format)
+PointFileExporter::PointFileExporter(DexData* data, const CVynStringT<wchar_t>& fileName,
+                                     const DexFormat* format)
     : DexExporterImpl(data, fileName, format) {}
 
 PointFileExporter::~PointFileExporter() {
@@ -82,7 +84,8 @@ bool PointFileExporter::open() {
   file_ = std::fopen(vyn_text::toUtf8(fileName.view()).c_str(), "wb");
   if (file_ == nullptr) return false;
   data->addFileNameToExported(fileName);
-  if ((settings.hasDataType(POINTS) || settings.hasDataType(POINT_LISTS)) && data->getNumberOfDatasets() > 0) {
+  if ((settings.hasDataType(POINTS) || settings.hasDataType(POINT_LISTS)) &&
+      data->getNumberOfDatasets() > 0) {
     dataset_ = data->getCurDataset();
     objectCount_ = dataset_ == nullptr ? 0 : dataset_->getNumberOfElements(OBJECT_TYPE_ALL, 2);
   }
@@ -118,7 +121,8 @@ void PointFileExporter::writePoint(const DexDesignPoint& point) {
   const DexStation& station = point.getStation();
   const bool horizontal = station.isHorizCoordsDefined();
   const auto number = [this](double meters, int decimalsIndex) {
-    return utils::distByStyleToString(layout_.units, meters, layout_.decimals[static_cast<std::size_t>(decimalsIndex)]);
+    return utils::distByStyleToString(layout_.units, meters,
+                                      layout_.decimals[static_cast<std::size_t>(decimalsIndex)]);
   };
   line_.clear();
   for (std::size_t column = 0; column < layout_.fields.size(); ++column) {
@@ -133,13 +137,15 @@ void PointFileExporter::writePoint(const DexDesignPoint& point) {
         appendValue(column, horizontal ? number(station.getY(), 1).view() : std::wstring_view(), false);
         break;
       case EColumn::HEIGHT:
-        appendValue(column, station.isHeightDefined() ? number(station.getZ(), 2).view() : std::wstring_view(),
+        appendValue(column,
+                    station.isHeightDefined() ? number(station.getZ(), 2).view() : std::wstring_view(),
                     false);
         break;
       case EColumn::GEOID_HEIGHT:
-        appendValue(column,
-                    station.isGeoidHeightDefined() ? number(station.getGeoidHeight(), 2).view() : std::wstring_view(),
-                    false);
+        appendValue(
+            column,
+            station.isGeoidHeightDefined() ? number(station.getGeoidHeight(), 2).view() : std::wstring_view(),
+            false);
         break;
       case EColumn::NOTES:
         appendValue(column, station.getNotes().view(), true);
@@ -156,7 +162,8 @@ void PointFileExporter::writePoint(const DexDesignPoint& point) {
         break;
       }
       case EColumn::LAYER:
-        appendValue(column, point.getLayer() != nullptr ? point.getLayer()->getName().view() : std::wstring_view(),
+        appendValue(column,
+                    point.getLayer() != nullptr ? point.getLayer()->getName().view() : std::wstring_view(),
                     true);
         break;
       case EColumn::IGNORED:

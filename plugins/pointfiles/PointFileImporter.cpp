@@ -42,7 +42,8 @@ class PointBuilder {
   }
 
   // The point of the values, or null with the reason.
-  std::unique_ptr<DexDesignPoint> build(const std::vector<std::wstring_view>& values, const wchar_t*& reason) {
+  std::unique_ptr<DexDesignPoint> build(const std::vector<std::wstring_view>& values,
+                                        const wchar_t*& reason) {
     auto point = std::make_unique<DexDesignPoint>();
     double north = kNoValue;
     double east = kNoValue;
@@ -148,7 +149,8 @@ bool isHeaderLine(const PointLayout& layout, const std::vector<std::wstring_view
 
 }  // namespace
 
-PointFileImporter::PointFileImporter(DexData* data, const CVynStringT<wchar_t>& fileName, const DexFormat* format)
+PointFileImporter::PointFileImporter(DexData* data, const CVynStringT<wchar_t>& fileName,
+                                     const DexFormat* format)
     : DexImporterImpl(data, fileName, format) {}
 
 PointFileImporter::~PointFileImporter() = default;

@@ -15,7 +15,7 @@ namespace vyn::ie::point_files {
 // layout says it has a header) is skipped. A malformed line (no name where the layout has a name, a
 // coordinate that is missing or not a number, a malformed code, a non-empty value beyond the last
 // column) is skipped and traced. Results: DEX_RESULT_OK; kResultLinesSkipped when lines were skipped
-// and at least one point was read; DEX_RESULT_WRONG_FORMAT when no line gave a point; 
+// and at least one point was read; DEX_RESULT_WRONG_FORMAT when no line gave a point;
 // DEX_RESULT_FILE_ERROR when the file cannot be opened; DEX_RESULT_STOPPED when DexData::stopProcess_
 // was set (the points read so far stay). The importer publishes how much of the file it has read.
 class PointFileImporter final : public DexImporterImpl {

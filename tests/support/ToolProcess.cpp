@@ -36,7 +36,8 @@ ToolProcess runTool(const std::string& arguments, const std::string& environment
 }
 
 ToolProcess runScript(const std::string& script) {
-  return runCommand("DEXCHANGE=" + quoted(DEXCHANGE_TOOL_PATH) + " timeout 60 bash -c " + quoted(script) + " </dev/null");
+  return runCommand("DEXCHANGE=" + quoted(DEXCHANGE_TOOL_PATH) + " timeout 60 bash -c " + quoted(script) +
+                    " </dev/null");
 }
 
 }  // namespace dex_test

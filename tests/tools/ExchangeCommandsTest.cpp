@@ -36,9 +36,11 @@ TEST(ConvertCommand, ConvertsTheSampleSurveyToCustomAsciiAndBackWithoutLoss) {
   const auto there = runTool("convert '" + sample() + "' '" + dir.file("survey.pts") + "' " + kFields);
   ASSERT_EQ(0, there.exitCode) << there.output;
   EXPECT_TRUE(contains(there.output, "converted 325 objects")) << there.output;
-  EXPECT_EQ(0u, dex_test::readFile(dir.file("survey.pts")).rfind("1000;5432100.000;312400.000;85.300;CP\r\n", 0));
+  EXPECT_EQ(0u,
+            dex_test::readFile(dir.file("survey.pts")).rfind("1000;5432100.000;312400.000;85.300;CP\r\n", 0));
 
-  const auto back = runTool("convert '" + dir.file("survey.pts") + "' '" + dir.file("again.csv") + "' " + kFields);
+  const auto back =
+      runTool("convert '" + dir.file("survey.pts") + "' '" + dir.file("again.csv") + "' " + kFields);
   ASSERT_EQ(0, back.exitCode) << back.output;
   EXPECT_EQ(samplePoints(), dex_test::readFile(dir.file("again.csv")));
 }
@@ -76,9 +78,8 @@ TEST(ConvertCommand, EveryFailureGivesOneLineAndANonZeroExitCode) {
   for (const auto& [arguments, exitCode] : cases) {
     const auto run = runTool(arguments);
     EXPECT_EQ(exitCode, run.exitCode) << arguments << "\n" << run.output;
-    const std::string last = run.output.substr(run.output.rfind("dexchange: ") == std::string::npos
-                                                   ? 0
-                                                   : run.output.rfind("dexchange: "));
+    const std::string last = run.output.substr(
+        run.output.rfind("dexchange: ") == std::string::npos ? 0 : run.output.rfind("dexchange: "));
     EXPECT_EQ(0u, last.rfind("dexchange: ", 0)) << run.output;
     EXPECT_EQ(1, std::count(last.begin(), last.end(), '\n')) << run.output;
   }
@@ -100,7 +101,8 @@ TEST(ConvertCommand, SkippedLinesAreReportedAsNotes) {
 TEST(ConvertCommand, CtrlCStopsTheRunWithExitCode130) {
   const TempDir dir;
   // The input is a pipe that delivers some lines, waits, then more: the signal comes in the wait.
-  const auto run = runScript("cd '" + dir.path() + "' || exit 1; mkfifo in.csv || exit 1; "
+  const auto run = runScript("cd '" + dir.path() +
+                             "' || exit 1; mkfifo in.csv || exit 1; "
                              "{ for i in $(seq 2000); do echo \"$i,1.0,2.0,3.0,GND\"; done; sleep 2; "
                              "  for i in $(seq 2000); do echo \"x$i,1.0,2.0,3.0,GND\"; done; } > in.csv & "
                              "writer=$!; \"$DEXCHANGE\" convert in.csv out.pts & tool=$!; sleep 1; "
@@ -115,7 +117,8 @@ TEST(InfoCommand, ShowsDatasetsObjectKindsCodesAndExtent) {
   const auto run = runTool("info '" + sample() + "'");
   ASSERT_EQ(0, run.exitCode) << run.output;
   EXPECT_TRUE(contains(run.output, "format:   CSV (Comma delimited) (.csv)\n")) << run.output;
-  EXPECT_TRUE(contains(run.output, "datasets: 1\n  \"Import dataset\": 325 objects\n    design points: 325\n"))
+  EXPECT_TRUE(
+      contains(run.output, "datasets: 1\n  \"Import dataset\": 325 objects\n    design points: 325\n"))
       << run.output;
   EXPECT_TRUE(contains(run.output, "codes: 11\n")) << run.output;
   EXPECT_TRUE(contains(run.output, "  EP                  120\n")) << run.output;
@@ -126,8 +129,8 @@ TEST(InfoCommand, ShowsDatasetsObjectKindsCodesAndExtent) {
 TEST(InfoCommand, NamesTheFormatByGuidNameOrExtension) {
   const TempDir dir;
   const std::string file = dir.write("points.txt", "A 1.5 2.5 3.5 CP\nB 4.5 5.5 6.5 EP:1\n");
-  for (const std::string& from :
-       {std::string("'{5F39DDC1-F0FD-4F27-938A-96EFF426CD60}'"), std::string("'ASCII Points'"), std::string("pts")}) {
+  for (const std::string& from : {std::string("'{5F39DDC1-F0FD-4F27-938A-96EFF426CD60}'"),
+                                  std::string("'ASCII Points'"), std::string("pts")}) {
     const auto run = runTool("info '" + file + "' --from " + from + " --delimiter space");
     EXPECT_EQ(0, run.exitCode) << run.output;
     EXPECT_TRUE(contains(run.output, "design points: 2\n")) << from << "\n" << run.output;

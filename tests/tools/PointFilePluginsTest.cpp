@@ -30,11 +30,11 @@ constexpr EDexResult kLinesSkipped = static_cast<EDexResult>(23);
 // serve both directions, so the tests use a copy that names both libraries.
 std::unique_ptr<DexFormat> bothWays(const wchar_t* id) {
   const DexFormat& format = *getIEFormatsData().getFormatById(id);
-  return std::make_unique<DexFormat>(format.getGuid(), format.getName(), DexFormat::IMPORT_AND_EXPORT,
-                                     L"ExportParsers", L"ImportParsers", format.getTitle(),
-                                     format.getExtension(false), format.getFilterExtension(),
-                                     format.getConfigurations(), format.getUsingModes(), format.getDataTypes(),
-                                     format.getDistanceUnits(), format.getAngleUnits(), format.getParameters());
+  return std::make_unique<DexFormat>(
+      format.getGuid(), format.getName(), DexFormat::IMPORT_AND_EXPORT, L"ExportParsers", L"ImportParsers",
+      format.getTitle(), format.getExtension(false), format.getFilterExtension(), format.getConfigurations(),
+      format.getUsingModes(), format.getDataTypes(), format.getDistanceUnits(), format.getAngleUnits(),
+      format.getParameters());
 }
 
 class AnswerBox final : public IDexMessageBox {
@@ -108,8 +108,9 @@ TEST_F(PointFiles, CsvToCustomAsciiToCsvKeepsEveryPointCodeAndCoordinate) {
   DexSettings settings = pointSettings();
   settings.userAsciiSettings = asciiLayout(L"Ht,FullCodes,Easting,Northing,Name", L'\t', true);
   const auto first = loaderWith(settings);
-  ASSERT_EQ(DEX_RESULT_OK, first->importInTheSameThread(dex_test::widen(dex_test::dataFile("pointfiles/coded_points.csv")).c_str(),
-                                                        csv_.get(), nullptr));
+  ASSERT_EQ(DEX_RESULT_OK, first->importInTheSameThread(
+                               dex_test::widen(dex_test::dataFile("pointfiles/coded_points.csv")).c_str(),
+                               csv_.get(), nullptr));
   const std::wstring asciiFile = dir_.wfile("points.txt");
   ASSERT_EQ(DEX_RESULT_OK, first->exportInTheSameThread(asciiFile.c_str(), ascii_.get(), nullptr));
 
@@ -143,22 +144,26 @@ TEST_F(PointFiles, CsvToCustomAsciiToCsvKeepsEveryPointCodeAndCoordinate) {
   EXPECT_EQ(0, pointAt(final, 4)->getNumberOfCodes());
   EXPECT_EQ(original.getIEDataDictionary()->getSize(), final.getIEDataDictionary()->getSize());
   // The header line names the user's columns in the user's order.
-  EXPECT_EQ(0u, dex_test::readFile(dex_test::narrow(asciiFile)).rfind("Ht\tFullCodes\tEasting\tNorthing\tName\r\n", 0));
+  EXPECT_EQ(
+      0u,
+      dex_test::readFile(dex_test::narrow(asciiFile)).rfind("Ht\tFullCodes\tEasting\tNorthing\tName\r\n", 0));
 }
 
 TEST_F(PointFiles, CsvLinesQuoteOnlyWhatNeedsQuotes) {
   const auto loader = loaderWith(pointSettings());
-  ASSERT_EQ(DEX_RESULT_OK, loader->importInTheSameThread(dex_test::widen(dex_test::dataFile("pointfiles/coded_points.csv")).c_str(),
-                                                         csv_.get(), nullptr));
+  ASSERT_EQ(DEX_RESULT_OK, loader->importInTheSameThread(
+                               dex_test::widen(dex_test::dataFile("pointfiles/coded_points.csv")).c_str(),
+                               csv_.get(), nullptr));
   const std::wstring file = dir_.wfile("out.csv");
   ASSERT_EQ(DEX_RESULT_OK, loader->exportInTheSameThread(file.c_str(), csv_.get(), nullptr));
-  EXPECT_EQ("100,5000.000,2000.000,101.250,CP\r\n"
-            "101,5010.125,2003.500,101.300,EP:1 KERB:L\r\n"
-            "102,5020.250,2007.000,,EP:1;Surface=Asphalt\r\n"
-            "\"Gate, north\",5030.375,2010.500,99.875,FENCE:A:B GATE;Width=4.5;Material=Steel\r\n"
-            "104,-12.500,0.001,0.000,\r\n"
-            "\xC3\x9C-7,5040.000,2014.000,100.000,TREE;Species=Oak\r\n",
-            dex_test::readFile(dex_test::narrow(file)));
+  EXPECT_EQ(
+      "100,5000.000,2000.000,101.250,CP\r\n"
+      "101,5010.125,2003.500,101.300,EP:1 KERB:L\r\n"
+      "102,5020.250,2007.000,,EP:1;Surface=Asphalt\r\n"
+      "\"Gate, north\",5030.375,2010.500,99.875,FENCE:A:B GATE;Width=4.5;Material=Steel\r\n"
+      "104,-12.500,0.001,0.000,\r\n"
+      "\xC3\x9C-7,5040.000,2014.000,100.000,TREE;Species=Oak\r\n",
+      dex_test::readFile(dex_test::narrow(file)));
 }
 
 TEST_F(PointFiles, FixedWidthColumnsAreWrittenAndReadByTheirWidths) {
@@ -170,8 +175,9 @@ TEST_F(PointFiles, FixedWidthColumnsAreWrittenAndReadByTheirWidths) {
     settings.userAsciiSettings->fields[i].alignment = i == 0 || i == 4 ? 1 : 0;
   }
   const auto first = loaderWith(settings);
-  ASSERT_EQ(DEX_RESULT_OK, first->importInTheSameThread(dex_test::widen(dex_test::dataFile("pointfiles/coded_points.csv")).c_str(),
-                                                        csv_.get(), nullptr));
+  ASSERT_EQ(DEX_RESULT_OK, first->importInTheSameThread(
+                               dex_test::widen(dex_test::dataFile("pointfiles/coded_points.csv")).c_str(),
+                               csv_.get(), nullptr));
   const std::wstring file = dir_.wfile("fixed.txt");
   ASSERT_EQ(DEX_RESULT_OK, first->exportInTheSameThread(file.c_str(), ascii_.get(), nullptr));
   const std::string text = dex_test::readFile(dex_test::narrow(file));
@@ -205,10 +211,12 @@ TEST_F(PointFiles, MalformedLinesImportTheGoodLinesAndReportTheSkippedOnes) {
 TEST_F(PointFiles, FilesWithoutAnyPointAreWrongAndMissingFilesCannotBeOpened) {
   const dex_test::LogCapture log;
   const auto loader = loaderWith(pointSettings());
-  EXPECT_EQ(DEX_RESULT_WRONG_FORMAT,
-            loader->importInTheSameThread(dex_test::widen(dex_test::dataFile("pointfiles/no_points.csv")).c_str(),
-                                          csv_.get(), nullptr));
-  EXPECT_EQ(DEX_RESULT_FILE_ERROR, loader->importInTheSameThread(dir_.wfile("missing.csv").c_str(), csv_.get(), nullptr));
+  EXPECT_EQ(
+      DEX_RESULT_WRONG_FORMAT,
+      loader->importInTheSameThread(dex_test::widen(dex_test::dataFile("pointfiles/no_points.csv")).c_str(),
+                                    csv_.get(), nullptr));
+  EXPECT_EQ(DEX_RESULT_FILE_ERROR,
+            loader->importInTheSameThread(dir_.wfile("missing.csv").c_str(), csv_.get(), nullptr));
   EXPECT_EQ(0, pointCount(*loader->getIEData()));
 }
 
@@ -219,16 +227,19 @@ TEST_F(PointFiles, AnExportOntoAnExistingFileWithoutAYesLeavesItByteIdentical) {
     DexSettings settings = pointSettings();
     if (withMessageBox) settings.messageBox = new AnswerBox(IDNO);
     const auto loader = loaderWith(settings);
-    ASSERT_EQ(DEX_RESULT_OK, loader->importInTheSameThread(dex_test::widen(dex_test::dataFile("pointfiles/coded_points.csv")).c_str(),
-                                                           csv_.get(), nullptr));
-    EXPECT_EQ(DEX_RESULT_FILE_ERROR, loader->exportInTheSameThread(dex_test::widen(path).c_str(), csv_.get(), nullptr));
+    ASSERT_EQ(DEX_RESULT_OK, loader->importInTheSameThread(
+                                 dex_test::widen(dex_test::dataFile("pointfiles/coded_points.csv")).c_str(),
+                                 csv_.get(), nullptr));
+    EXPECT_EQ(DEX_RESULT_FILE_ERROR,
+              loader->exportInTheSameThread(dex_test::widen(path).c_str(), csv_.get(), nullptr));
     EXPECT_EQ(before, dex_test::readFile(path));
   }
   DexSettings settings = pointSettings();
   settings.messageBox = new AnswerBox(IDYES);
   const auto loader = loaderWith(settings);
-  ASSERT_EQ(DEX_RESULT_OK, loader->importInTheSameThread(dex_test::widen(dex_test::dataFile("pointfiles/coded_points.csv")).c_str(),
-                                                         csv_.get(), nullptr));
+  ASSERT_EQ(DEX_RESULT_OK, loader->importInTheSameThread(
+                               dex_test::widen(dex_test::dataFile("pointfiles/coded_points.csv")).c_str(),
+                               csv_.get(), nullptr));
   EXPECT_EQ(DEX_RESULT_OK, loader->exportInTheSameThread(dex_test::widen(path).c_str(), csv_.get(), nullptr));
   EXPECT_EQ(0u, dex_test::readFile(path).rfind("100,5000.000", 0));
 }
@@ -237,7 +248,8 @@ TEST_F(PointFiles, TheStopFlagEndsAnImportAndAStoppedExportLeavesNoFile) {
   const std::string path = dir_.writeRepeated("many.csv", "", "7,1.0,2.0,3.0,GND\r\n", 5000, "");
   const auto loader = loaderWith(pointSettings());
   DexData::stopProcess_ = true;
-  EXPECT_EQ(DEX_RESULT_STOPPED, loader->importInTheSameThread(dex_test::widen(path).c_str(), csv_.get(), nullptr));
+  EXPECT_EQ(DEX_RESULT_STOPPED,
+            loader->importInTheSameThread(dex_test::widen(path).c_str(), csv_.get(), nullptr));
   EXPECT_LT(pointCount(*loader->getIEData()), 5000);
 
   DexData::stopProcess_ = false;
@@ -270,8 +282,9 @@ TEST_F(PointFiles, WorkerThreadRunsGiveTheSameResults) {
   CloseHandle(exportRun);
   EXPECT_EQ(DEX_RESULT_OK, DexParsersLoader::resultFromExitCode(exitCode));
   EXPECT_EQ(6, log.countMessage(L"malformed_lines.csv"));
-  EXPECT_EQ("1,100.000,200.000,10.000,CP\r\n3,101.000,201.000,10.200,EP:1\r\n7,106.000,206.000,10.700,GND\r\n",
-            dex_test::readFile(dex_test::narrow(out)));
+  EXPECT_EQ(
+      "1,100.000,200.000,10.000,CP\r\n3,101.000,201.000,10.200,EP:1\r\n7,106.000,206.000,10.700,GND\r\n",
+      dex_test::readFile(dex_test::narrow(out)));
 }
 
 TEST_F(PointFiles, CoordinatesAreReadAndWrittenInTheSettingsUnit) {
@@ -295,8 +308,9 @@ TEST_F(PointFiles, ThePlugInsMakeNoParserForOtherFormats) {
   const DexFormat* other = getIEFormatsData().getFormatById(L"{E653FE2B-C46A-400E-BA60-864A221BE19F}");
   ASSERT_NE(nullptr, other);
   const auto loader = loaderWith(pointSettings());
-  EXPECT_EQ(DEX_RESULT_NO_PARSER, loader->importInTheSameThread(dex_test::widen(dex_test::dataFile("pointfiles/coded_points.csv")).c_str(),
-                                                                other, nullptr));
+  EXPECT_EQ(DEX_RESULT_NO_PARSER,
+            loader->importInTheSameThread(
+                dex_test::widen(dex_test::dataFile("pointfiles/coded_points.csv")).c_str(), other, nullptr));
   const std::wstring out = dir_.wfile("none.vxml");
   EXPECT_EQ(DEX_RESULT_NO_PARSER, loader->exportInTheSameThread(out.c_str(), other, nullptr));
   EXPECT_FALSE(std::ifstream(dex_test::narrow(out)).good());
@@ -306,8 +320,9 @@ TEST_F(PointFiles, SettingsWithoutPointsReadAndWriteNoPoint) {
   DexSettings settings;
   settings.addDataType(CODES);
   const auto loader = loaderWith(settings);
-  EXPECT_EQ(DEX_RESULT_OK, loader->importInTheSameThread(dex_test::widen(dex_test::dataFile("pointfiles/coded_points.csv")).c_str(),
-                                                         csv_.get(), nullptr));
+  EXPECT_EQ(DEX_RESULT_OK, loader->importInTheSameThread(
+                               dex_test::widen(dex_test::dataFile("pointfiles/coded_points.csv")).c_str(),
+                               csv_.get(), nullptr));
   EXPECT_EQ(0, pointCount(*loader->getIEData()));
 }
 

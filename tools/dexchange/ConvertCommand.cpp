@@ -57,12 +57,13 @@ class ConvertCommand final : public Command {
   std::string name() const override { return "convert"; }
   std::string summary() const override { return "convert a file from one exchange format to another"; }
   std::string help() const override {
-    return std::string("usage: dexchange convert IN OUT [--from FORMAT] [--to FORMAT] [--types LIST]\n"
-                       "                        [--fields LIST] [--delimiter C] [--units UNIT] [--force]\n"
-                       "\n"
-                       "Imports IN into a data container through the plug-in of its format, then exports the\n"
-                       "container to OUT, each run in a worker thread (a progress bar on a terminal; Ctrl-C stops\n"
-                       "the run, and a stopped export leaves no file behind).\n") +
+    return std::string(
+               "usage: dexchange convert IN OUT [--from FORMAT] [--to FORMAT] [--types LIST]\n"
+               "                        [--fields LIST] [--delimiter C] [--units UNIT] [--force]\n"
+               "\n"
+               "Imports IN into a data container through the plug-in of its format, then exports the\n"
+               "container to OUT, each run in a worker thread (a progress bar on a terminal; Ctrl-C stops\n"
+               "the run, and a stopped export leaves no file behind).\n") +
            kOptionsHelp +
            "  --force            overwrite OUT when it exists (on a terminal the tool asks; otherwise it\n"
            "                     refuses)\n"

@@ -76,7 +76,8 @@ const DexFormat* findByExtension(const std::string& extension, bool forExport) {
     const int match = format == nullptr ? 0 : extensionMatch(*format, extension);
     if (match == 0) continue;
     // Shipped formats first, then the own extension before a filter's, then a library for the direction.
-    const int rank = (isShipped(*format) ? 8 : 0) + match * 2 + (format->getDllName(forExport).IsEmpty() ? 0 : 1);
+    const int rank =
+        (isShipped(*format) ? 8 : 0) + match * 2 + (format->getDllName(forExport).IsEmpty() ? 0 : 1);
     if (rank > bestRank) {
       best = format;
       bestRank = rank;
@@ -107,14 +108,15 @@ std::unique_ptr<DexFormat> completedFormat(const DexFormat& format) {
       format.getGuid(), format.getName(), DexFormat::IMPORT_AND_EXPORT,
       exportLibrary.IsEmpty() ? WideString(kShippedExportLibrary) : exportLibrary,
       importLibrary.IsEmpty() ? WideString(kShippedImportLibrary) : importLibrary, format.getTitle(),
-      format.getExtension(false), format.getFilterExtension(), format.getConfigurations(), format.getUsingModes(),
-      format.getDataTypes(), format.getDistanceUnits(), format.getAngleUnits(), format.getParameters());
+      format.getExtension(false), format.getFilterExtension(), format.getConfigurations(),
+      format.getUsingModes(), format.getDataTypes(), format.getDistanceUnits(), format.getAngleUnits(),
+      format.getParameters());
 }
 
 }  // namespace
 
-std::unique_ptr<FormatChoice> FormatChoice::find(const std::string& spec, const std::string& path, bool forExport,
-                                                 std::string& error) {
+std::unique_ptr<FormatChoice> FormatChoice::find(const std::string& spec, const std::string& path,
+                                                 bool forExport, std::string& error) {
   const DexFormat* format = nullptr;
   if (spec.empty()) {
     const std::string extension = lowerCase(extensionOf(path));
@@ -136,7 +138,8 @@ std::unique_ptr<FormatChoice> FormatChoice::find(const std::string& spec, const 
     }
   } else {
     format = findByName(spec);
-    if (format == nullptr) format = findByExtension(lowerCase(spec.front() == '.' ? spec.substr(1) : spec), forExport);
+    if (format == nullptr)
+      format = findByExtension(lowerCase(spec.front() == '.' ? spec.substr(1) : spec), forExport);
     if (format == nullptr) {
       error = "no format named " + spec;
       return nullptr;
@@ -314,7 +317,8 @@ class NoteCollector {
       if (!record.message.empty()) {
         notes.push_back(vyn_text::toUtf8(record.message));
       } else {
-        notes.push_back("log record " + vyn_text::toUtf8(record.source) + " line " + std::to_string(record.line));
+        notes.push_back("log record " + vyn_text::toUtf8(record.source) + " line " +
+                        std::to_string(record.line));
       }
     });
   }
@@ -338,7 +342,8 @@ class ProgressBar {
     const int percent = fraction < 0.0 ? 0 : static_cast<int>(fraction * 100.0);
     const int filled = percent * kWidth / 100;
     std::cerr << '\r' << label_ << " [" << std::string(static_cast<std::size_t>(filled), '#')
-              << std::string(static_cast<std::size_t>(kWidth - filled), ' ') << "] " << percent << "%" << std::flush;
+              << std::string(static_cast<std::size_t>(kWidth - filled), ' ') << "] " << percent << "%"
+              << std::flush;
     drawn_ = true;
   }
 
@@ -376,8 +381,8 @@ RunOutcome runInWorker(vyn::ie::DexParsersLoader& loader, bool exportRun, const 
   return outcome;
 }
 
-std::string failureText(EDexResult result, bool exportRun, const std::string& path, const std::string& formatName,
-                        const vyn::ie::DexParsersLoader& loader) {
+std::string failureText(EDexResult result, bool exportRun, const std::string& path,
+                        const std::string& formatName, const vyn::ie::DexParsersLoader& loader) {
   if (result >= 0) return {};
   switch (result) {
     case vyn::ie::DEX_RESULT_STOPPED:
@@ -394,8 +399,8 @@ std::string failureText(EDexResult result, bool exportRun, const std::string& pa
     case vyn::ie::DEX_RESULT_FILE_NOT_FOUND:
       return path + " not found";
     default:
-      return std::string(exportRun ? "writing " : "reading ") + path + " failed (result " + std::to_string(result) +
-             ")";
+      return std::string(exportRun ? "writing " : "reading ") + path + " failed (result " +
+             std::to_string(result) + ")";
   }
 }
 

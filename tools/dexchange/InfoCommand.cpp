@@ -18,10 +18,13 @@ namespace {
 using vyn::ie::DexObject;
 
 const char* kindName(int kind) {
-  static const char* const kNames[] = {"design points", "point-to-line points", "GNSS raw points", "sheet points",
-                                       "polylines",     "areas",                "breaklines",      "arcs",
-                                       "surfaces",      "alignments",           "parcels",         "text labels",
-                                       "circles",       "regions"};
+  static const char* const kNames[] = {"design points",   "point-to-line points",
+                                       "GNSS raw points", "sheet points",
+                                       "polylines",       "areas",
+                                       "breaklines",      "arcs",
+                                       "surfaces",        "alignments",
+                                       "parcels",         "text labels",
+                                       "circles",         "regions"};
   return kind >= 0 && kind < static_cast<int>(std::size(kNames)) ? kNames[kind] : "other objects";
 }
 
@@ -91,7 +94,9 @@ class InfoCommand final : public Command {
            "\n"
            "Exit codes: 0 shown, 1 the import failed, 2 wrong command line, 130 stopped.\n";
   }
-  std::set<std::string> valuedOptions() const override { return {"from", "types", "fields", "delimiter", "units"}; }
+  std::set<std::string> valuedOptions() const override {
+    return {"from", "types", "fields", "delimiter", "units"};
+  }
 
   int run(const Arguments& arguments, ToolStreams& streams) const override {
     if (arguments.positional().size() != 1) return fail(streams, kExitUsage, "info: give one FILE");
@@ -122,8 +127,8 @@ class InfoCommand final : public Command {
                     const RunOutcome& outcome, vyn::ie::DexData& data) {
     out << "file:     " << path << '\n';
     out << "format:   " << format.name() << '\n';
-    out << "result:   " << outcome.result << (outcome.result == vyn::ie::DEX_RESULT_OK ? " (ok)" : " (with remarks)")
-        << '\n';
+    out << "result:   " << outcome.result
+        << (outcome.result == vyn::ie::DEX_RESULT_OK ? " (ok)" : " (with remarks)") << '\n';
     out << "datasets: " << data.getNumberOfDatasets() << '\n';
     Summary all;
     for (int d = 0; d < data.getNumberOfDatasets(); ++d) {
