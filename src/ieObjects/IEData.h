@@ -1,5 +1,5 @@
 #pragma once
-// TEMPORARY STUB (not committed): stands in for the container until it lands on main.
+// TEMPORARY STUB: stands in for the container until it lands; same signatures as the real one.
 #include <atomic>
 #include <vector>
 #include "hostlibs/DexApi.h"
@@ -8,6 +8,7 @@
 #include "ieObjects/IEDataDictionary.h"
 #include "ieUtils/IERunProgress.h"
 #include "ieUtils/IESettings.h"
+#include "ieUtils/IEUtilsStringArray.h"
 namespace vyn::ie {
 class DexDataset;
 class DEX_API DexData {
@@ -19,7 +20,7 @@ class DEX_API DexData {
   DexData& operator=(const DexData&) = delete;
   const DexSettings& getSettings() const { return settings_; }
   void setSettings(const DexSettings& s) { settings_ = s; }
-  void addDataset(DexDataset* d);
+  bool addDataset(DexDataset* d);
   int getNumberOfDatasets() const { return static_cast<int>(datasets_.size()); }
   DexDataset* getDatasetAt(int i) const;
   void setCurDataset(int i);
@@ -28,18 +29,19 @@ class DEX_API DexData {
   DexDataDictionary* getIEDataDictionary();
   bool addCodeToIEDataDictionary(DexCodeDescription* d);
   void addFileNameToExported(const CVynStringT<wchar_t>& name);
-  const std::vector<CVynStringT<wchar_t>>& getExportedFileNames() const { return exported_; }
-  void clearExportedFileNames() { exported_.clear(); }
+  const utils::StringArray& getExportedFileNames() const noexcept { return exported_; }
+  void clearExportedFileNames() { exported_.RemoveAll(); }
   bool prepareDatasetsForMultipleFilesExport(bool multipleFiles);
   DexRunProgress& getProgress() { return progress_; }
   const DexRunProgress& getProgress() const { return progress_; }
   static std::atomic<bool> stopProcess_;
+
  private:
   DexSettings settings_;
   std::vector<DexDataset*> datasets_;
   int cur_ = 0;
   DexDataDictionary* dictionary_ = nullptr;
-  std::vector<CVynStringT<wchar_t>> exported_;
+  utils::StringArray exported_;
   DexRunProgress progress_;
 };
 }  // namespace vyn::ie

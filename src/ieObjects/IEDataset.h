@@ -1,5 +1,5 @@
 #pragma once
-// TEMPORARY STUB (not committed).
+// TEMPORARY STUB: stands in for the dataset until it lands.
 #include <vector>
 #include "hostlibs/DexApi.h"
 #include "hostlibs/VynAlloc.h"
@@ -24,6 +24,7 @@ class DEX_API DexDataset : public IDexNameInterface {
   bool isObjectWithoutCodes() const noexcept { return noCodes_; }
   bool isCodeDefinitionUsed(const DexCodeDescription* d) const;
   void copyIEObjectsWithTheCodeToTheNewDataset(DexDataset* target, const CVynStringT<wchar_t>& code) const;
+
  private:
   CVynStringT<wchar_t> name_;
   std::vector<DexObject*> objects_;

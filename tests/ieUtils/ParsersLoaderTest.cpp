@@ -195,7 +195,7 @@ TEST_P(ParsersLoaderRun, ExportsTheCurrentDatasetAndRecordsTheFile) {
   addPoint(data(), *dataset, L"P1", {L"A"});
   EXPECT_EQ(DEX_RESULT_OK, runExport(wpath("out.txt"), &format_));
   EXPECT_EQ("P1 A", firstLine(path("out.txt")));
-  ASSERT_EQ(1u, data().getExportedFileNames().size());
+  ASSERT_EQ(1, data().getExportedFileNames().GetSize());
   EXPECT_EQ(wpath("out.txt"), std::wstring(data().getExportedFileNames()[0].view()));
 }
 
@@ -241,6 +241,26 @@ TEST_P(ParsersLoaderRun, AnExportLibraryWithoutEntryPointHasNoParserAndLogsLine5
   EXPECT_EQ(DEX_RESULT_NO_PARSER, runExport(wpath("out.txt"), &noEntry));
   EXPECT_EQ(1, capture.count(kLoaderSource, 52));
   EXPECT_FALSE(std::filesystem::exists(path("out.txt")));
+}
+
+TEST_P(ParsersLoaderRun, AnExportLibraryThatCannotBeLoadedHasNoParserAndLogsLine52) {
+  const DexFormat missing = dex_test::makeFormat(L"{33333333-2222-3333-4444-555555555555}",
+                                                 dex_test::scriptedPlugin(), L"/nonexistent/libDexNone.so");
+  LogCapture capture;
+  EXPECT_EQ(DEX_RESULT_NO_PARSER, runExport(wpath("out.txt"), &missing));
+  EXPECT_EQ(1, capture.count(kLoaderSource, 52));
+  EXPECT_EQ(0, capture.count(kLoaderSource, 100));
+  EXPECT_FALSE(std::filesystem::exists(path("out.txt")));
+}
+
+TEST_P(ParsersLoaderRun, AnImportLibraryWithoutEntryPointHasNoParserAndLogsLine100) {
+  const DexFormat noEntry = dex_test::makeFormat(L"{33333333-2222-3333-4444-555555555555}",
+                                                 dex_test::noEntryPointsPlugin(), dex_test::scriptedPlugin());
+  writeText(path("in.txt"), "point P1\n");
+  LogCapture capture;
+  EXPECT_EQ(DEX_RESULT_NO_PARSER, runImport(wpath("in.txt"), &noEntry));
+  EXPECT_EQ(1, capture.count(kLoaderSource, 100));
+  EXPECT_EQ(0, data().getNumberOfDatasets());
 }
 
 TEST_P(ParsersLoaderRun, AFailedLoadDropsTheLibraryHeldBefore) {
@@ -353,7 +373,7 @@ TEST_P(ParsersLoaderRun, AStoppedExportDeletesEveryFileItRecorded) {
             runStoppedExport(wpath("out.txt"), &format_, path("out.txt"), "write extra.txt\n"));
   EXPECT_FALSE(std::filesystem::exists(path("out.txt")));
   EXPECT_FALSE(std::filesystem::exists(path("extra.txt")));
-  EXPECT_EQ(2u, data().getExportedFileNames().size());
+  EXPECT_EQ(2, data().getExportedFileNames().GetSize());
 }
 
 TEST_P(ParsersLoaderRun, AFileThatCannotBeRemovedLeavesATraceAndTheOthersAreStillDeleted) {
@@ -374,7 +394,7 @@ TEST_P(ParsersLoaderRun, AStopNeverDeletesTheFilesOfAnEarlierExport) {
   EXPECT_EQ(DEX_RESULT_STOPPED, runStoppedExport(wpath("second.txt"), &format_, path("second.txt"), ""));
   EXPECT_TRUE(std::filesystem::exists(path("first.txt")));
   EXPECT_FALSE(std::filesystem::exists(path("second.txt")));
-  ASSERT_EQ(1u, data().getExportedFileNames().size());
+  ASSERT_EQ(1, data().getExportedFileNames().GetSize());
   EXPECT_EQ(wpath("second.txt"), std::wstring(data().getExportedFileNames()[0].view()));
 }
 
@@ -414,7 +434,7 @@ TEST_P(ParsersLoaderPerDataset, WritesOneFileNamedAfterEachDatasetIntoTheFolder)
   EXPECT_EQ(DEX_RESULT_OK, runExport(dir_.wpath(), &perDataset_));
   for (const char* name : {"D1.txt", "D2.txt", "D3.txt"})
     EXPECT_TRUE(std::filesystem::exists(path(name))) << name;
-  EXPECT_EQ(3u, data().getExportedFileNames().size());
+  EXPECT_EQ(3, data().getExportedFileNames().GetSize());
 }
 
 TEST_P(ParsersLoaderPerDataset, AFailureEndsTheRunBeforeTheNextDataset) {
@@ -451,7 +471,7 @@ TEST_P(ParsersLoaderPerDataset, AStopDeletesTheFilesOfTheDatasetsExportedBefore)
             runStoppedExport(dir_.wpath(), &perDataset_, path("D2.txt"), "write D2-extra.txt\n"));
   for (const char* name : {"D1.txt", "D2.txt", "D2-extra.txt", "D3.txt"})
     EXPECT_FALSE(std::filesystem::exists(path(name))) << name;
-  EXPECT_EQ(3u, data().getExportedFileNames().size());
+  EXPECT_EQ(3, data().getExportedFileNames().GetSize());
 }
 
 TEST_P(ParsersLoaderPerDataset, DatasetNamesAreMadeValidFileNames) {
