@@ -39,9 +39,11 @@ void appendUtf8(std::wstring_view text, std::string& out) {
 
 bool needsQuotes(std::wstring_view value, wchar_t delimiter) {
   if (value.empty()) return false;
-  if (value.front() == L' ' || value.back() == L' ' || value.front() == L'\t' || value.back() == L'\t')
-    return true;
-  return value.find_first_of(std::wstring{delimiter, kQuote, L'\r', L'\n'}) != std::wstring_view::npos;
+  const auto isBlank = [](wchar_t ch) { return ch == L' ' || ch == L'\t'; };
+  if (isBlank(value.front()) || isBlank(value.back())) return true;
+  return std::any_of(value.begin(), value.end(), [delimiter](wchar_t ch) {
+    return ch == delimiter || ch == kQuote || ch == L'\r' || ch == L'\n';
+  });
 }
 
 }  // namespace
