@@ -1,0 +1,104 @@
+#include "ieObjects/IEAlignment.h"
+
+#include <gtest/gtest.h>
+
+#include <cmath>
+#include <limits>
+#include <string>
+
+#include "ObjectsTestHelpers.h"
+#include "ieObjects/detail/AlignmentLog.h"
+#include "support/LogCapture.h"
+
+namespace {
+
+using vyn::ie::DexAlignment;
+using vyn::ie::DexHorizontalAlignment;
+using vyn::ie::IDexAlignmentPart;
+namespace detail = vyn::ie::detail;
+
+const std::wstring kSource = detail::kAlignmentLogSource;
+
+TEST(DexAlignment, NewAlignmentIsKindNineInStateOneWithoutParts) {
+  DexAlignment alignment;
+  EXPECT_EQ(9, alignment.getType());
+  EXPECT_EQ(1, alignment.getStateType());
+  for (int type = 0; type < IDexAlignmentPart::kNumberOfPartTypes; ++type)
+    EXPECT_EQ(nullptr, alignment.getAlignmentPart(type));
+  EXPECT_EQ(nullptr, alignment.getStaEquationSet());
+}
+
+TEST(DexAlignment, FirstPartOfAKindIsThePrimaryOne) {
+  DexHorizontalAlignment first;
+  DexHorizontalAlignment second;
+  DexAlignment alignment;
+  alignment.setAlignmentPart(&first);
+  alignment.setAlignmentPart(&second);
+  EXPECT_EQ(&first, alignment.getAlignmentPart(IDexAlignmentPart::HORIZONTAL_ALIGNMENT));
+  EXPECT_EQ(nullptr, alignment.getAlignmentPart(IDexAlignmentPart::VERTICAL_ALIGNMENT));
+}
+
+TEST(DexAlignment, NullPartsAndUnknownKindsAreReported) {
+  const dex_test::LogCapture log;
+  DexAlignment alignment;
+  alignment.setAlignmentPart(nullptr);
+  EXPECT_EQ(nullptr, alignment.getAlignmentPart(4));
+  EXPECT_EQ(nullptr, alignment.getAlignmentPart(-1));
+  EXPECT_EQ(1, log.count(kSource, detail::kAlignmentNullPartLine));
+  EXPECT_EQ(2, log.count(kSource, detail::kAlignmentPartTypeLine));
+}
+
+TEST(DexAlignment, StationIntervalMustBePositive) {
+  DexAlignment alignment;
+  double interval = -1.0;
+  EXPECT_FALSE(alignment.getStnInterval(interval));
+  EXPECT_EQ(-1.0, interval);
+  EXPECT_FALSE(alignment.setStnInterval(0.0));
+  EXPECT_TRUE(alignment.setStnInterval(20.0));
+  EXPECT_FALSE(alignment.setStnInterval(-5.0));
+  EXPECT_TRUE(alignment.getStnInterval(interval));
+  EXPECT_EQ(20.0, interval);
+}
+
+TEST(DexAlignment, NaNClearsACorridorOffset) {
+  DexAlignment alignment;
+  alignment.setCorridorLeftOffset(3.5);
+  EXPECT_TRUE(alignment.hasCorridorLeftOffset());
+  EXPECT_EQ(3.5, alignment.getCorridorLeftOffset());
+  alignment.setCorridorLeftOffset(std::numeric_limits<double>::quiet_NaN());
+  EXPECT_FALSE(alignment.hasCorridorLeftOffset());
+  EXPECT_EQ(0.0, alignment.getCorridorLeftOffset());
+  alignment.setCorridorRightOffset(-2.0);
+  EXPECT_TRUE(alignment.hasCorridorRightOffset());
+  EXPECT_FALSE(alignment.hasCorridorLeftOffset());
+}
+
+TEST(DexAlignment, CopySharesPartsAndDuplicatesDrawProperties) {
+  DexHorizontalAlignment part;
+  DexAlignment alignment;
+  alignment.setName(L"ROAD 1");
+  alignment.setAlignmentPart(&part);
+  alignment.setDrawProperties(objects_test::linePropertiesOf(0x00FF00));
+
+  const DexAlignment copy(alignment);
+  EXPECT_EQ(L"ROAD 1", copy.getName());
+  EXPECT_EQ(&part, copy.getAlignmentPart(0));
+  ASSERT_NE(nullptr, copy.getDrawProperties());
+  EXPECT_NE(alignment.getDrawProperties(), copy.getDrawProperties());
+  EXPECT_EQ(0x00FF00u, objects_test::colorOf(copy.getDrawProperties()));
+}
+
+TEST(DexHorizontalAlignment, IsAHorizontalPartInStateOne) {
+  DexHorizontalAlignment alignment;
+  EXPECT_EQ(IDexAlignmentPart::HORIZONTAL_ALIGNMENT, alignment.getType());
+  EXPECT_EQ(1, alignment.getStateType());
+  EXPECT_EQ(nullptr, alignment.getStartPoint());
+  alignment.setName(L"H1");
+  alignment.setStaStart(100.0);
+  alignment.setLength(250.0);
+  EXPECT_EQ(L"H1", alignment.getName());
+  EXPECT_EQ(100.0, alignment.getStaStart());
+  EXPECT_EQ(250.0, alignment.getLength());
+}
+
+}  // namespace
