@@ -2,8 +2,8 @@
 
 #include <string>
 #include <string_view>
-#include <unordered_map>
 
+#include "LineValues.h"
 #include "hostlibs/VynString.h"
 #include "ieObjects/IECodesDataInterface.h"
 
@@ -42,23 +42,12 @@ class CodeReader {
   bool read(std::wstring_view text, DexCodesDataInterface& target);
 
  private:
-  struct Hash {
-    using is_transparent = void;
-    std::size_t operator()(std::wstring_view text) const noexcept {
-      return std::hash<std::wstring_view>{}(text);
-    }
-  };
-  struct Equal {
-    using is_transparent = void;
-    bool operator()(std::wstring_view a, std::wstring_view b) const noexcept { return a == b; }
-  };
-
   // The library's description of that code, added when missing; null only without data.
   const DexCodeDescription* description(std::wstring_view name);
   bool readOne(std::wstring_view item, DexCodesDataInterface& target);
 
   DexData* data_;
-  std::unordered_map<std::wstring, const DexCodeDescription*, Hash, Equal> known_;
+  TextMap<const DexCodeDescription*> known_;
   CVynStringT<wchar_t> first_;
   CVynStringT<wchar_t> second_;
 };

@@ -2,6 +2,7 @@
 
 #include <string>
 #include <string_view>
+#include <unordered_map>
 #include <utility>
 #include <vector>
 
@@ -42,5 +43,19 @@ bool parseNumber(std::wstring_view text, double& value);
 
 // True when text is blank (blanks, tabs and line ends only).
 bool isBlankText(std::wstring_view text);
+
+// A map by text that is searched with a view, so that a look-up makes no heap block.
+struct TextHash {
+  using is_transparent = void;
+  std::size_t operator()(std::wstring_view text) const noexcept {
+    return std::hash<std::wstring_view>{}(text);
+  }
+};
+struct TextEqual {
+  using is_transparent = void;
+  bool operator()(std::wstring_view a, std::wstring_view b) const noexcept { return a == b; }
+};
+template <class T>
+using TextMap = std::unordered_map<std::wstring, T, TextHash, TextEqual>;
 
 }  // namespace vyn::ie::point_files

@@ -14,6 +14,7 @@
 #include "hostlibs/VynLogging.h"
 #include "ieObjects/IEData.h"
 #include "ieObjects/IEDataset.h"
+#include "ieObjects/IELayers.h"
 #include "ieObjects/IEPoints.h"
 #include "ieUtils/IEFileReaders.h"
 
@@ -35,7 +36,7 @@ std::uint64_t fileSize(const CVynStringT<wchar_t>& fileName) {
 // Turns the values of one line into a design point.
 class PointBuilder {
  public:
-  PointBuilder(DexData* data, const PointLayout& layout) : layout_(layout), codes_(data) {
+  PointBuilder(DexData* data, const PointLayout& layout) : layout_(layout), data_(data), codes_(data) {
     for (const ascii_fields::DexFieldFormat& field : layout.fields)
       columns_.push_back(columnOf(field.type));
     hasName_ = layout.findColumn(EColumn::NAME) >= 0;
@@ -88,6 +89,8 @@ class PointBuilder {
           if (!codes_.read(value, *point)) return fail(reason, L"malformed code");
           break;
         case EColumn::LAYER:
+          if (!value.empty()) point->setLayer(layer(value), false);
+          break;
         case EColumn::IGNORED:
           break;
       }
@@ -125,7 +128,24 @@ class PointBuilder {
     point.setStation(station);
   }
 
+  // The draw dictionary's layer of that name, added when missing.
+  const DexLayer* layer(std::wstring_view name) {
+    if (const auto found = layers_.find(name); found != layers_.end()) return found->second;
+    assignText(text_, name);
+    DexDrawDictionary* dictionary = data_->getIEDrawDictionary();
+    DexLayer* held = dictionary->findLayer(text_);
+    if (held == nullptr) {
+      held = new DexLayer();
+      held->setName(text_);
+      dictionary->addLayer(held);
+    }
+    layers_.emplace(std::wstring(name), held);
+    return held;
+  }
+
   const PointLayout& layout_;
+  DexData* data_;
+  TextMap<const DexLayer*> layers_;
   std::vector<EColumn> columns_;
   bool hasName_ = false;
   CodeReader codes_;

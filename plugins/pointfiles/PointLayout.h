@@ -39,7 +39,7 @@ enum class EColumn {
   CODES_STRINGS,  // Codes&Strings: the codes with their code strings
   CODES_ATTRS,    // Codes&Attributes: the codes with their attribute values
   FULL_CODES,     // FullCodes: the codes with code strings and attribute values
-  LAYER,          // Layer Name: written on export, not kept on import
+  LAYER,          // Layer Name: the layer of the draw dictionary (added when missing)
   IGNORED,        // any other point field: read over, written empty
 };
 

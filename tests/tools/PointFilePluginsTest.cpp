@@ -11,6 +11,7 @@
 #include "ieObjects/IEData.h"
 #include "ieObjects/IEDataDictionary.h"
 #include "ieObjects/IEDataset.h"
+#include "ieObjects/IELayers.h"
 #include "ieObjects/IEPoints.h"
 #include "ieUtils/IEParsersLoader.h"
 #include "ieUtils/IESettings.h"
@@ -314,6 +315,23 @@ TEST_F(PointFiles, ThePlugInsMakeNoParserForOtherFormats) {
   const std::wstring out = dir_.wfile("none.vxml");
   EXPECT_EQ(DEX_RESULT_NO_PARSER, loader->exportInTheSameThread(out.c_str(), other, nullptr));
   EXPECT_FALSE(std::ifstream(dex_test::narrow(out)).good());
+}
+
+TEST_F(PointFiles, LayerNamesBecomeLayersOfTheDrawDictionary) {
+  DexSettings settings = pointSettings();
+  settings.userAsciiSettings = asciiLayout(L"Name,Northing,Easting,Layer Name", L',');
+  const auto loader = loaderWith(settings);
+  const std::string path = dir_.write("layers.txt", "P1,1,2,Walls\nP2,3,4,Walls\nP3,5,6,Roads\nP4,7,8,\n");
+  ASSERT_EQ(DEX_RESULT_OK,
+            loader->importInTheSameThread(dex_test::widen(path).c_str(), ascii_.get(), nullptr));
+  DexData& data = *loader->getIEData();
+  ASSERT_EQ(2, data.getIEDrawDictionary()->getNumberOfLayers());
+  EXPECT_EQ(data.getIEDrawDictionary()->findLayer(L"Walls"), pointAt(data, 1)->getLayer());
+  EXPECT_EQ(nullptr, pointAt(data, 3)->getLayer());
+  const std::wstring out = dir_.wfile("layers-out.txt");
+  ASSERT_EQ(DEX_RESULT_OK, loader->exportInTheSameThread(out.c_str(), ascii_.get(), nullptr));
+  EXPECT_EQ("P1,1.000,2.000,Walls\r\nP2,3.000,4.000,Walls\r\nP3,5.000,6.000,Roads\r\nP4,7.000,8.000,\r\n",
+            dex_test::readFile(dex_test::narrow(out)));
 }
 
 TEST_F(PointFiles, SettingsWithoutPointsReadAndWriteNoPoint) {
