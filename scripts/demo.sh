@@ -2,8 +2,17 @@
 # The README's demo: runs the command-line host on the bundled samples.
 set -euo pipefail
 tool=${1:-build/tools/dexchange/dexchange}
+samples=$(cd "$(dirname "$0")/../samples" && pwd)
+work=$(mktemp -d)
+trap 'rm -rf "$work"' EXIT
 run() { echo "\$ dexchange $*"; "$tool" "$@"; echo; }
 run --version
 run --help
 # The formats a host offers when the user exports points.
 run formats --export --type POINTS
+# The bundled survey, CSV -> customizable ASCII (semicolon-delimited, the user's columns), then what
+# the written file holds.
+fields="Name,Northing,Easting,Ht,FullCodes"
+run convert "$samples/survey.csv" "$work/survey.pts" --fields "$fields" --delimiter ';' --force
+echo "\$ head -4 survey.pts"; head -4 "$work/survey.pts"; echo
+run info "$work/survey.pts" --fields "$fields" --delimiter ';'
