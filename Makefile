@@ -38,11 +38,12 @@ sanitize: deps
 	ASAN_OPTIONS=detect_leaks=1:abort_on_error=1 UBSAN_OPTIONS=print_stacktrace=1:halt_on_error=1 \
 		ctest --test-dir $(SANITIZE_DIR) --output-on-failure -j$(JOBS)
 
-# The runs in worker threads under ThreadSanitizer: the loader's and the run functions' tests.
-TSAN_TESTS ?= ParsersLoader|ImporterExporter|RunProgress
+# The runs in worker threads under ThreadSanitizer: the loader's and the run functions' tests and the
+# real plug-ins run through the loader.
+TSAN_TESTS ?= ParsersLoader|ImporterExporter|RunProgress|PointFiles\.
 tsan: deps
 	cmake -S . -B $(TSAN_DIR) -DCMAKE_BUILD_TYPE=Debug -DDEXCHANGE_TSAN=ON $(CMAKE_ARGS)
-	cmake --build $(TSAN_DIR) -j$(JOBS) --target dexchange_ieUtils_tests
+	cmake --build $(TSAN_DIR) -j$(JOBS) --target dexchange_ieUtils_tests dexchange_tools_tests
 	TSAN_OPTIONS=halt_on_error=1:second_deadlock_stack=1 \
 		ctest --test-dir $(TSAN_DIR) --output-on-failure -j$(JOBS) -R '$(TSAN_TESTS)'
 
