@@ -17,6 +17,8 @@ enum EDexResult : std::int32_t {
   DEX_RESULT_FAILED = -10000,         // general failure
 };
 
-constexpr bool isDexResultSuccess(EDexResult result) noexcept { return result >= 0; }
+constexpr bool isDexResultSuccess(EDexResult result) noexcept {
+  return result >= 0;
+}
 
 }  // namespace vyn::ie
