@@ -161,7 +161,8 @@ DEX_API bool isExportFileWithSameName(const CVynStringT<wchar_t>& fileName, cons
 //     if (format == nullptr || !format->isIdEqual(kMyFormatId)) return nullptr;
 //     return new MyExporter(data, fileName, format);
 //   }
-// NOLINTNEXTLINE(bugprone-macro-parentheses): the arguments are parameter names
+// NOLINTBEGIN(bugprone-macro-parentheses): the arguments are parameter names
 #define DEX_MAKE_EXPORTER(data, fileName, format)           \
   extern "C" DEX_API ::vyn::ie::IDexExporter* MakeExporter( \
       ::vyn::ie::DexData* data, const CVynStringT<wchar_t>& fileName, const ::vyn::ie::DexFormat* format)
+// NOLINTEND(bugprone-macro-parentheses)

@@ -112,7 +112,8 @@ inline constexpr const char* kMakeImporterEntryPoint = "MakeImporter";
 //     if (format == nullptr || !format->isIdEqual(kMyFormatId)) return nullptr;
 //     return new MyImporter(data, fileName, format);
 //   }
-// NOLINTNEXTLINE(bugprone-macro-parentheses): the arguments are parameter names
+// NOLINTBEGIN(bugprone-macro-parentheses): the arguments are parameter names
 #define DEX_MAKE_IMPORTER(data, fileName, format)           \
   extern "C" DEX_API ::vyn::ie::IDexImporter* MakeImporter( \
       ::vyn::ie::DexData* data, const CVynStringT<wchar_t>& fileName, const ::vyn::ie::DexFormat* format)
+// NOLINTEND(bugprone-macro-parentheses)

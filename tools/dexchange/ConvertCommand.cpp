@@ -11,8 +11,6 @@
 namespace dexchange_tool {
 namespace {
 
-using vyn::ie::EDexResult;
-
 const char* const kOptionsHelp =
     "  --from FORMAT      the format of IN: a braced GUID, a format name or title, or an extension\n"
     "                     (default: the extension of IN)\n"

@@ -128,10 +128,12 @@ bool PositionOctree::growRoot() {
     return true;
   }
   for (int octant = 0; octant < 8; ++octant) {
-    const auto oldOctant = static_cast<std::size_t>(oldRoot.firstChild + octant);
+    const std::int32_t oldOctantIndex = oldRoot.firstChild + octant;
+    const auto oldOctant = static_cast<std::size_t>(oldOctantIndex);
     if (nodes_[oldOctant].firstChild < 0 && nodes_[oldOctant].entries.empty()) continue;
     const std::int32_t grandchildren = addOctantsOf(first + octant);
-    nodes_[static_cast<std::size_t>(grandchildren + (7 - octant))] = std::move(nodes_[oldOctant]);
+    const std::int32_t newPlace = grandchildren + (7 - octant);
+    nodes_[static_cast<std::size_t>(newPlace)] = std::move(nodes_[oldOctant]);
   }
   return true;
 }
@@ -170,8 +172,10 @@ void PositionOctree::splitWhileFull(std::int32_t leaf, const Point& point) {
     entries.swap(nodes_[static_cast<std::size_t>(leaf)].entries);
     const std::int32_t first = addOctantsOf(leaf);
     const Node& parent = nodes_[static_cast<std::size_t>(leaf)];
-    for (const Entry& entry : entries)
-      nodes_[static_cast<std::size_t>(first + octantOf(parent, entry.point))].entries.push_back(entry);
+    for (const Entry& entry : entries) {
+      const std::int32_t child = first + octantOf(parent, entry.point);
+      nodes_[static_cast<std::size_t>(child)].entries.push_back(entry);
+    }
     leaf = first + octantOf(nodes_[static_cast<std::size_t>(leaf)], point);
   }
 }
