@@ -40,6 +40,8 @@ class PointBuilder {
     for (const ascii_fields::DexFieldFormat& field : layout.fields)
       columns_.push_back(columnOf(field.type));
     hasName_ = layout.findColumn(EColumn::NAME) >= 0;
+    hasNorth_ = layout.findColumn(EColumn::NORTH) >= 0;
+    hasEast_ = layout.findColumn(EColumn::EAST) >= 0;
   }
 
   // The point of the values, or null with the reason.
@@ -96,8 +98,8 @@ class PointBuilder {
       }
     }
     if (hasName_ && !named) return fail(reason, L"no point name");
-    if (layout_.findColumn(EColumn::NORTH) >= 0 && north == kNoValue) return fail(reason, L"no northing");
-    if (layout_.findColumn(EColumn::EAST) >= 0 && east == kNoValue) return fail(reason, L"no easting");
+    if (hasNorth_ && north == kNoValue) return fail(reason, L"no northing");
+    if (hasEast_ && east == kNoValue) return fail(reason, L"no easting");
     if (geoidHeight == kNoValue) {
       point->setCoords(north, east, height);
     } else {
@@ -148,6 +150,8 @@ class PointBuilder {
   TextMap<const DexLayer*> layers_;
   std::vector<EColumn> columns_;
   bool hasName_ = false;
+  bool hasNorth_ = false;
+  bool hasEast_ = false;
   CodeReader codes_;
   CVynStringT<wchar_t> text_;
 };

@@ -1,4 +1,3 @@
-#include <sys/stat.h>
 #include <unistd.h>
 
 #include <iostream>
@@ -22,11 +21,6 @@ const char* const kOptionsHelp =
     "  --delimiter C      the delimiter of a customizable ASCII point file: one character, or tab,\n"
     "                     space, comma, semicolon, pipe (default: comma)\n"
     "  --units UNIT       the distance unit of the files (METERS, USFEET, IFEET, ...; default: meters)\n";
-
-bool fileExists(const std::string& path) {
-  struct stat info {};
-  return ::stat(path.c_str(), &info) == 0;
-}
 
 // Whether OUT may be overwritten: --force, or a yes on a terminal. False with the reason otherwise.
 bool mayOverwrite(const Arguments& arguments, const std::string& path, std::string& error) {

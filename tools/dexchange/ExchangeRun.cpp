@@ -21,6 +21,10 @@ using vyn::ie::DexFormat;
 using vyn::ie::EDexResult;
 using WideString = CVynStringT<wchar_t>;
 
+bool fileExists(const std::string& path) {
+  return PathFileExistsW(wide(path)) != 0;
+}
+
 std::string utf8(const WideString& text) {
   return vyn_text::toUtf8(text.view());
 }

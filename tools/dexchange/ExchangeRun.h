@@ -63,6 +63,9 @@ int exitCodeOf(vyn::ie::EDexResult result);
 // Writes the notes of a run as "dexchange: note: ..." lines (at most a few).
 void printNotes(ToolStreams& streams, const RunOutcome& outcome);
 
+// Whether a file or folder of that (UTF-8) path exists.
+bool fileExists(const std::string& path);
+
 std::string utf8(const CVynStringT<wchar_t>& text);
 CVynStringT<wchar_t> wide(const std::string& text);
 

@@ -1,5 +1,3 @@
-#include <sys/stat.h>
-
 #include <algorithm>
 #include <charconv>
 #include <map>
@@ -107,8 +105,7 @@ class InfoCommand final : public Command {
     vyn::ie::DexSettings settings;
     if (!makeSettings(arguments, *from->format(), false, settings, error))
       return fail(streams, kExitUsage, "info: " + error);
-    struct stat info {};
-    if (::stat(path.c_str(), &info) != 0) return fail(streams, kExitFailure, "info: " + path + " not found");
+    if (!fileExists(path)) return fail(streams, kExitFailure, "info: " + path + " not found");
 
     vyn::ie::DexParsersLoader loader;
     loader.initIEData(settings);
