@@ -1,8 +1,13 @@
 #include "hostlibs/VynString.h"
 
 #include <algorithm>
+#include <array>
+#include <cstdint>
+#include <cstdlib>
 #include <cwchar>
 #include <cwctype>
+#include <new>
+#include <utility>
 #include <vector>
 
 #include "hostlibs/detail/CLocale.h"
@@ -76,92 +81,264 @@ std::size_t endAfterLastNotOf(std::wstring_view text, std::wstring_view targets)
   return found == std::wstring_view::npos ? 0 : found + 1;
 }
 
+// Trimming deletes in place; an empty set of targets trims nothing.
+String& trimLeftOf(String& text, std::wstring_view targets) {
+  if (targets.empty()) return text;
+  const std::size_t first = firstNotOf(text.view(), targets);
+  if (first > 0) text.Delete(0, toInt(first));
+  return text;
+}
+String& trimRightOf(String& text, std::wstring_view targets) {
+  if (targets.empty()) return text;
+  const std::size_t end = endAfterLastNotOf(text.view(), targets);
+  const std::size_t size = text.view().size();
+  if (end < size) text.Delete(toInt(end), toInt(size - end));
+  return text;
+}
+
 }  // namespace
 
+// A block: the header, then capacity + 1 characters (the last one always a terminator). A capacity of
+// 0 marks a shared read-only block of the one-character table.
+struct String::Header {
+  std::uint32_t length;
+  std::uint32_t capacity;
+};
+
+namespace {
+
+// The one-character ASCII texts: every occurrence shares its block, so that single-letter codes and
+// code strings cost no allocation. Laid out as a Header followed by the characters.
+struct SharedCharacter {
+  std::uint32_t length;
+  std::uint32_t capacity;
+  wchar_t chars[2];  // NOLINT(modernize-avoid-c-arrays): the characters of a block
+};
+static_assert(offsetof(SharedCharacter, chars) == 2 * sizeof(std::uint32_t));
+
+constexpr std::size_t kSharedCharacters = 128;
+
+constexpr std::array<SharedCharacter, kSharedCharacters> makeSharedCharacters() {
+  std::array<SharedCharacter, kSharedCharacters> table{};
+  for (std::size_t ch = 1; ch < kSharedCharacters; ++ch)
+    table[ch] = {1, 0, {static_cast<wchar_t>(ch), L'\0'}};
+  return table;
+}
+
+// Never written (a capacity of 0 forbids it), but not const: the string's character pointer is not.
+// NOLINTNEXTLINE(cppcoreguidelines-avoid-non-const-global-variables)
+constinit std::array<SharedCharacter, kSharedCharacters> sharedCharacters = makeSharedCharacters();
+
+wchar_t* sharedBlockFor(std::wstring_view text) noexcept {
+  if (text.size() != 1 || text[0] <= 0 || static_cast<std::size_t>(text[0]) >= kSharedCharacters)
+    return nullptr;
+  return sharedCharacters[static_cast<std::size_t>(text[0])].chars;
+}
+
+// A heap block for capacity characters; throws std::bad_alloc like the standard strings.
+wchar_t* allocateBlock(std::size_t capacity) {
+  if (capacity > 0x7fffffffU) throw std::bad_alloc();
+  const std::size_t bytes = 2 * sizeof(std::uint32_t) + (capacity + 1) * sizeof(wchar_t);
+  auto* block = static_cast<std::uint32_t*>(std::malloc(bytes));
+  if (block == nullptr) throw std::bad_alloc();
+  block[0] = 0;
+  block[1] = static_cast<std::uint32_t>(capacity);
+  auto* chars = reinterpret_cast<wchar_t*>(block + 2);
+  chars[0] = L'\0';
+  chars[capacity] = L'\0';
+  return chars;
+}
+
+}  // namespace
+
+String::Header* String::header() const noexcept {
+  return reinterpret_cast<Header*>(reinterpret_cast<char*>(chars_) - sizeof(Header));
+}
+std::size_t String::length() const noexcept {
+  return chars_ == nullptr ? 0 : header()->length;
+}
+void String::release() noexcept {
+  if (chars_ != nullptr && header()->capacity > 0) std::free(header());
+  chars_ = nullptr;
+}
+void String::setLength(std::size_t newLength) noexcept {
+  if (chars_ == nullptr) return;
+  header()->length = static_cast<std::uint32_t>(newLength);
+  chars_[newLength] = L'\0';
+}
+
+void String::reserveOwned(std::size_t capacity) {
+  const std::size_t current = length();
+  if (chars_ != nullptr && header()->capacity >= std::max<std::size_t>(capacity, 1)) return;
+  wchar_t* const grown = allocateBlock(std::max({capacity, current, std::size_t{1}}));
+  std::wmemcpy(grown, GetString(), current);
+  release();
+  chars_ = grown;
+  setLength(current);
+}
+wchar_t* String::writableChars() {
+  if (chars_ != nullptr && header()->capacity == 0) reserveOwned(length());
+  return chars_;
+}
+
+void String::assign(std::wstring_view text) {
+  if (text.empty()) {
+    if (chars_ != nullptr && header()->capacity > 0) {
+      setLength(0);
+    } else {
+      chars_ = nullptr;
+    }
+    return;
+  }
+  // An owned block large enough is reused (text may lie inside it, hence the move).
+  if (chars_ != nullptr && header()->capacity >= text.size()) {
+    std::wmemmove(chars_, text.data(), text.size());
+    setLength(text.size());
+    return;
+  }
+  if (wchar_t* const shared = sharedBlockFor(text)) {
+    release();
+    chars_ = shared;
+    return;
+  }
+  wchar_t* const fresh = allocateBlock(text.size());
+  std::wmemcpy(fresh, text.data(), text.size());
+  release();
+  chars_ = fresh;
+  setLength(text.size());
+}
+void String::append(std::wstring_view text) {
+  if (text.empty()) return;
+  const std::size_t current = length();
+  const std::size_t needed = current + text.size();
+  if (chars_ == nullptr) {
+    assign(text);
+    return;
+  }
+  if (header()->capacity < needed) {
+    // The old block stays alive until text, which may lie in it, has been copied.
+    wchar_t* const grown = allocateBlock(std::max(needed, std::size_t{2} * header()->capacity));
+    std::wmemcpy(grown, chars_, current);
+    std::wmemcpy(grown + current, text.data(), text.size());
+    release();
+    chars_ = grown;
+  } else {
+    std::wmemcpy(chars_ + current, text.data(), text.size());
+  }
+  setLength(needed);
+}
+
 String::CVynStringT() noexcept = default;
-String::CVynStringT(const wchar_t* text) : text_(viewOf(text)) {}
+String::CVynStringT(const wchar_t* text) {
+  assign(viewOf(text));
+}
 String::CVynStringT(const wchar_t* text, int length) {
-  if (text != nullptr && length > 0) text_.assign(text, static_cast<std::size_t>(length));
+  if (text != nullptr && length > 0) assign(std::wstring_view(text, static_cast<std::size_t>(length)));
 }
 String::CVynStringT(wchar_t ch, int count) {
-  if (count > 0) text_.assign(static_cast<std::size_t>(count), ch);
+  if (count <= 0) return;
+  reserveOwned(static_cast<std::size_t>(count));
+  std::wmemset(chars_, ch, static_cast<std::size_t>(count));
+  setLength(static_cast<std::size_t>(count));
 }
 String::CVynStringT(const char* text, unsigned codePage) {
   if (text == nullptr) return;
   const std::string_view bytes(text);
-  text_ = codePage == CP_WINDOWS_1252 ? detail::fromCp1252(bytes) : detail::fromUtf8(bytes);
+  assign(codePage == CP_WINDOWS_1252 ? detail::fromCp1252(bytes) : detail::fromUtf8(bytes));
 }
-String::CVynStringT(std::wstring_view text) : text_(text) {}
-String::CVynStringT(const CVynStringT& other) = default;
-String::CVynStringT(CVynStringT&& other) noexcept = default;
-String::~CVynStringT() = default;
+String::CVynStringT(std::wstring_view text) {
+  assign(text);
+}
+String::CVynStringT(const CVynStringT& other) {
+  assign(other.view());
+}
+String::CVynStringT(CVynStringT&& other) noexcept : chars_(std::exchange(other.chars_, nullptr)) {}
+String::~CVynStringT() {
+  release();
+}
 
-String& String::operator=(const CVynStringT& other) = default;
-String& String::operator=(CVynStringT&& other) noexcept = default;
+String& String::operator=(const CVynStringT& other) {
+  if (this != &other) assign(other.view());
+  return *this;
+}
+String& String::operator=(CVynStringT&& other) noexcept {
+  if (this != &other) {
+    release();
+    chars_ = std::exchange(other.chars_, nullptr);
+  }
+  return *this;
+}
 String& String::operator=(const wchar_t* text) {
-  // The argument may point into this text.
-  std::wstring copy(viewOf(text));
-  text_.swap(copy);
+  assign(viewOf(text));
   return *this;
 }
 String& String::operator=(wchar_t ch) {
-  text_.assign(1, ch);
+  assign(std::wstring_view(&ch, 1));
   return *this;
 }
 String& String::operator+=(const CVynStringT& text) {
-  text_ += text.text_;
+  append(text.view());
   return *this;
 }
 String& String::operator+=(const wchar_t* text) {
-  const std::wstring copy(viewOf(text));
-  text_ += copy;
+  append(viewOf(text));
   return *this;
 }
 String& String::operator+=(wchar_t ch) {
-  text_.push_back(ch);
+  append(std::wstring_view(&ch, 1));
   return *this;
 }
 
 int String::GetLength() const noexcept {
-  return toInt(text_.size());
+  return toInt(length());
 }
 bool String::IsEmpty() const noexcept {
-  return text_.empty();
+  return length() == 0;
 }
 void String::Empty() noexcept {
-  text_.clear();
+  release();
 }
 
 wchar_t String::GetAt(int index) const noexcept {
-  return index >= 0 && static_cast<std::size_t>(index) < text_.size() ? text_[static_cast<std::size_t>(index)]
-                                                                      : L'\0';
+  return index >= 0 && static_cast<std::size_t>(index) < length() ? chars_[index] : L'\0';
 }
 wchar_t String::operator[](int index) const noexcept {
   return GetAt(index);
 }
 void String::SetAt(int index, wchar_t ch) noexcept {
-  if (index >= 0 && static_cast<std::size_t>(index) < text_.size())
-    text_[static_cast<std::size_t>(index)] = ch;
+  if (index < 0 || static_cast<std::size_t>(index) >= length()) return;
+  if (header()->capacity == 0) {
+    // A shared character becomes a text of its own, or the shared one for the new character.
+    assign(std::wstring_view(&ch, 1));
+    return;
+  }
+  chars_[index] = ch;
 }
 const wchar_t* String::GetString() const noexcept {
-  return text_.c_str();
+  return chars_ == nullptr ? L"" : chars_;
 }
 String::operator const wchar_t*() const noexcept {
-  return text_.c_str();
+  return GetString();
 }
 std::wstring_view String::view() const noexcept {
-  return text_;
+  return {GetString(), length()};
 }
 
 wchar_t* String::GetBuffer(int minLength) {
-  if (minLength > 0 && static_cast<std::size_t>(minLength) > text_.size()) {
-    text_.resize(static_cast<std::size_t>(minLength));
+  const std::size_t current = length();
+  const std::size_t wanted = minLength > 0 ? static_cast<std::size_t>(minLength) : 0;
+  reserveOwned(std::max(current, wanted));
+  if (wanted > current) {
+    std::wmemset(chars_ + current, L'\0', wanted - current);
+    setLength(wanted);
   }
-  return text_.data();
+  return chars_;
 }
 void String::ReleaseBuffer(int newLength) {
-  const std::size_t length = newLength < 0 ? std::wcslen(text_.c_str()) : clampIndex(newLength, text_.size());
-  text_.resize(length);
+  if (writableChars() == nullptr) return;
+  const std::size_t current = length();
+  const std::size_t kept = newLength < 0 ? std::wcslen(chars_) : clampIndex(newLength, current);
+  setLength(std::min(kept, current));
 }
 
 int String::Compare(const wchar_t* text) const noexcept {
@@ -172,95 +349,103 @@ int String::CompareNoCase(const wchar_t* text) const noexcept {
   return compareFolded(view(), viewOf(text));
 }
 
+// The rarer edits rebuild the text; the frequent ones (trimming, case, Replace of a character) work in
+// place.
 int String::Insert(int index, wchar_t ch) {
-  text_.insert(clampIndex(index, text_.size()), 1, ch);
-  return GetLength();
+  return Insert(index, std::wstring(1, ch).c_str());
 }
 int String::Insert(int index, const wchar_t* text) {
-  const std::wstring copy(viewOf(text));
-  text_.insert(clampIndex(index, text_.size()), copy);
+  std::wstring edited(view());
+  edited.insert(clampIndex(index, edited.size()), viewOf(text));
+  assign(edited);
   return GetLength();
 }
 int String::Delete(int index, int count) {
-  if (index >= 0 && count > 0 && static_cast<std::size_t>(index) < text_.size()) {
-    text_.erase(static_cast<std::size_t>(index), static_cast<std::size_t>(count));
-  }
+  const std::size_t size = length();
+  if (index < 0 || count <= 0 || static_cast<std::size_t>(index) >= size) return GetLength();
+  const auto first = static_cast<std::size_t>(index);
+  const std::size_t removed = std::min(static_cast<std::size_t>(count), size - first);
+  wchar_t* const chars = writableChars();
+  std::wmemmove(chars + first, chars + first + removed, size - first - removed);
+  setLength(size - removed);
   return GetLength();
 }
 int String::Remove(wchar_t ch) {
-  const auto removed = std::erase(text_, ch);
-  return toInt(removed);
+  const std::size_t size = length();
+  if (view().find(ch) == std::wstring_view::npos) return 0;
+  wchar_t* const chars = writableChars();
+  const std::size_t kept = static_cast<std::size_t>(std::remove(chars, chars + size, ch) - chars);
+  setLength(kept);
+  return toInt(size - kept);
 }
 int String::Replace(wchar_t oldChar, wchar_t newChar) {
-  int changes = 0;
-  for (wchar_t& ch : text_) {
-    if (ch == oldChar) {
-      ch = newChar;
-      ++changes;
-    }
-  }
+  const auto changes = static_cast<int>(std::count(view().begin(), view().end(), oldChar));
+  if (changes == 0 || oldChar == newChar) return changes;
+  wchar_t* const chars = writableChars();
+  std::replace(chars, chars + length(), oldChar, newChar);
   return changes;
 }
 int String::Replace(const wchar_t* oldText, const wchar_t* newText) {
   const std::wstring from(viewOf(oldText));
   const std::wstring to(viewOf(newText));
   if (from.empty()) return 0;
+  const std::wstring_view text = view();
   int changes = 0;
   std::wstring result;
   std::size_t position = 0;
-  for (std::size_t found = text_.find(from); found != std::wstring::npos;
-       found = text_.find(from, position)) {
-    result.append(text_, position, found - position);
+  for (std::size_t found = text.find(from); found != std::wstring_view::npos;
+       found = text.find(from, position)) {
+    result.append(text.substr(position, found - position));
     result += to;
     position = found + from.size();
     ++changes;
   }
   if (changes > 0) {
-    result.append(text_, position, std::wstring::npos);
-    text_.swap(result);
+    result.append(text.substr(position));
+    assign(result);
   }
   return changes;
 }
 
 int String::Find(wchar_t ch, int start) const noexcept {
-  if (start < 0 || static_cast<std::size_t>(start) >= text_.size()) return -1;
-  const std::size_t found = text_.find(ch, static_cast<std::size_t>(start));
-  return found == std::wstring::npos ? -1 : toInt(found);
+  if (start < 0 || static_cast<std::size_t>(start) >= length()) return -1;
+  const std::size_t found = view().find(ch, static_cast<std::size_t>(start));
+  return found == std::wstring_view::npos ? -1 : toInt(found);
 }
 int String::Find(const wchar_t* text, int start) const noexcept {
-  if (text == nullptr || start < 0 || static_cast<std::size_t>(start) > text_.size()) return -1;
-  const std::size_t found = text_.find(text, static_cast<std::size_t>(start));
-  return found == std::wstring::npos ? -1 : toInt(found);
+  if (text == nullptr || start < 0 || static_cast<std::size_t>(start) > length()) return -1;
+  const std::size_t found = view().find(text, static_cast<std::size_t>(start));
+  return found == std::wstring_view::npos ? -1 : toInt(found);
 }
 int String::FindOneOf(const wchar_t* characters) const noexcept {
   const std::wstring_view set = viewOf(characters);
   if (set.empty()) return -1;
-  const std::size_t found = text_.find_first_of(set);
-  return found == std::wstring::npos ? -1 : toInt(found);
+  const std::size_t found = view().find_first_of(set);
+  return found == std::wstring_view::npos ? -1 : toInt(found);
 }
 int String::ReverseFind(wchar_t ch) const noexcept {
-  const std::size_t found = text_.rfind(ch);
-  return found == std::wstring::npos ? -1 : toInt(found);
+  const std::size_t found = view().rfind(ch);
+  return found == std::wstring_view::npos ? -1 : toInt(found);
 }
 
 String String::Mid(int first) const {
   return Mid(first, GetLength());
 }
 String String::Mid(int first, int count) const {
-  const std::size_t begin = clampIndex(first, text_.size());
+  const std::size_t begin = clampIndex(first, length());
   if (count <= 0) return {};
   return String(view().substr(begin, static_cast<std::size_t>(count)));
 }
 String String::Left(int count) const {
-  return count <= 0 ? String() : String(view().substr(0, clampIndex(count, text_.size())));
+  return count <= 0 ? String() : String(view().substr(0, clampIndex(count, length())));
 }
 String String::Right(int count) const {
-  const std::size_t length = clampIndex(count, text_.size());
-  return String(view().substr(text_.size() - length));
+  const std::size_t kept = clampIndex(count, length());
+  return String(view().substr(length() - kept));
 }
 
 String String::Tokenize(const wchar_t* delimiters, int& start) const {
-  if (start < 0 || static_cast<std::size_t>(start) > text_.size()) {
+  if (start < 0 || static_cast<std::size_t>(start) > length()) {
     start = -1;
     return {};
   }
@@ -297,43 +482,38 @@ String& String::Trim(const wchar_t* targets) {
   return TrimRight(targets).TrimLeft(targets);
 }
 String& String::TrimLeft() {
-  text_.erase(0, firstNotOf(text_, kWhiteSpace));
-  return *this;
+  return trimLeftOf(*this, kWhiteSpace);
 }
 String& String::TrimLeft(wchar_t target) {
-  text_.erase(0, firstNotOf(text_, std::wstring_view(&target, 1)));
-  return *this;
+  return trimLeftOf(*this, std::wstring_view(&target, 1));
 }
 String& String::TrimLeft(const wchar_t* targets) {
-  const std::wstring copy(viewOf(targets));
-  if (!copy.empty()) text_.erase(0, firstNotOf(text_, copy));
-  return *this;
+  return trimLeftOf(*this, viewOf(targets));
 }
 String& String::TrimRight() {
-  text_.resize(endAfterLastNotOf(text_, kWhiteSpace));
-  return *this;
+  return trimRightOf(*this, kWhiteSpace);
 }
 String& String::TrimRight(wchar_t target) {
-  text_.resize(endAfterLastNotOf(text_, std::wstring_view(&target, 1)));
-  return *this;
+  return trimRightOf(*this, std::wstring_view(&target, 1));
 }
 String& String::TrimRight(const wchar_t* targets) {
-  const std::wstring copy(viewOf(targets));
-  if (!copy.empty()) text_.resize(endAfterLastNotOf(text_, copy));
-  return *this;
+  return trimRightOf(*this, viewOf(targets));
 }
 String& String::MakeUpper() {
-  for (wchar_t& ch : text_)
-    ch = static_cast<wchar_t>(towupper_l(ch, detail::numericLocale()));
+  wchar_t* const chars = writableChars();
+  for (std::size_t i = 0; i < length(); ++i)
+    chars[i] = static_cast<wchar_t>(towupper_l(chars[i], detail::numericLocale()));
   return *this;
 }
 String& String::MakeLower() {
-  for (wchar_t& ch : text_)
-    ch = foldCase(ch);
+  wchar_t* const chars = writableChars();
+  for (std::size_t i = 0; i < length(); ++i)
+    chars[i] = foldCase(chars[i]);
   return *this;
 }
 String& String::MakeReverse() {
-  std::reverse(text_.begin(), text_.end());
+  wchar_t* const chars = writableChars();
+  if (chars != nullptr) std::reverse(chars, chars + length());
   return *this;
 }
 
@@ -352,11 +532,11 @@ void String::AppendFormat(const wchar_t* format, ...) {
 void String::FormatV(const wchar_t* format, va_list arguments) {
   std::wstring rendered;
   if (!renderFormat(rendered, format, arguments)) rendered.clear();
-  text_.swap(rendered);
+  assign(rendered);
 }
 void String::AppendFormatV(const wchar_t* format, va_list arguments) {
   std::wstring rendered;
-  if (renderFormat(rendered, format, arguments)) text_ += rendered;
+  if (renderFormat(rendered, format, arguments)) append(rendered);
 }
 
 String operator+(const String& left, const String& right) {

@@ -23,8 +23,10 @@ class CVynStringT;
 
 // The wide string of every interface: value semantics and the operations of an MFC string. One
 // wchar_t holds one character (wchar_t is 32-bit here). Indexes are ints; an index outside the text
-// never crashes: readers answer 0 or clamp, writers do nothing. The representation is private so that
-// it may change (short texts held without a heap block) without touching a caller.
+// never crashes: readers answer 0 or clamp, writers do nothing. Like the MFC string it is one pointer
+// wide: the empty text holds no memory, one ASCII character is shared from a read-only table, and any
+// other text owns one heap block (length, capacity and characters), so that the model's many mostly
+// empty texts cost little.
 template <>
 class DEX_API CVynStringT<wchar_t> {
  public:
@@ -120,7 +122,21 @@ class DEX_API CVynStringT<wchar_t> {
   void AppendFormatV(const wchar_t* format, va_list arguments);
 
  private:
-  std::wstring text_;
+  struct Header;
+
+  Header* header() const noexcept;
+  std::size_t length() const noexcept;
+  void assign(std::wstring_view text);
+  void append(std::wstring_view text);
+  // An owned block (never a shared one) of at least capacity characters, keeping the text.
+  void reserveOwned(std::size_t capacity);
+  // Characters that may be written in place; null for the empty text without block.
+  wchar_t* writableChars();
+  void setLength(std::size_t length) noexcept;
+  void release() noexcept;
+
+  // The characters of a block that starts with a Header; null for the empty text.
+  wchar_t* chars_ = nullptr;
 };
 
 // Concatenation.

@@ -238,3 +238,46 @@ TEST(CVynString, CopiesAreIndependentAndMovesLeaveAValidSource) {
   EXPECT_NE(nullptr, heap);
   delete heap;
 }
+
+// One-character texts share a read-only block; every writer must give the text its own first.
+TEST(CVynString, SharedOneCharacterTextsAreNeverWrittenThrough) {
+  static_assert(sizeof(String) == sizeof(void*), "a text is one pointer wide");
+  const String a(L"A");
+  String b(L"A");
+  EXPECT_EQ(a.GetString(), b.GetString());
+  b.SetAt(0, L'x');
+  EXPECT_EQ(a, L"A");
+  EXPECT_EQ(b, L"x");
+
+  String c(L"A");
+  c.MakeLower();
+  c += L"bc";
+  EXPECT_EQ(c, L"abc");
+  String d(L"A");
+  d.GetBuffer(3)[1] = L'z';
+  d.ReleaseBuffer(2);
+  EXPECT_EQ(d, L"Az");
+  String e(L"A");
+  e.Delete(0);
+  e.Replace(L'A', L'B');
+  String f(L"A");
+  f.Replace(L'A', L'B');
+  f.TrimRight(L'B');
+  String g(L"A");
+  g.MakeReverse();
+  g.ReleaseBuffer(0);
+  EXPECT_TRUE(e.IsEmpty());
+  EXPECT_TRUE(f.IsEmpty());
+  EXPECT_TRUE(g.IsEmpty());
+  EXPECT_EQ(a, L"A");
+  EXPECT_EQ(String(L"A"), L"A");
+
+  // A block large enough is reused, also for a text that lies inside it.
+  String h(L"long enough text");
+  h = h.GetString() + 5;
+  EXPECT_EQ(h, L"enough text");
+  h = L"é";
+  h.Empty();
+  EXPECT_EQ(h.GetLength(), 0);
+  EXPECT_STREQ(h.GetString(), L"");
+}
