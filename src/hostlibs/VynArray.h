@@ -4,17 +4,19 @@
 #include <iterator>
 #include <vector>
 
+#include "hostlibs/VynCompactVector.h"
+
 namespace vyn_templ {
 
-// An MFC-style growable array over std::vector. Indexes are ints. Reading past the end answers a
-// default element and writing past the end does nothing (SetAtGrow grows instead), so a bad index
-// from a field file never crashes a plug-in.
+// An MFC-style growable array (one short item held without a heap block). Indexes are ints. Reading past the
+// end answers a default element and writing past the end does nothing (SetAtGrow grows instead), so a bad
+// index from a field file never crashes a plug-in.
 template <class TYPE, class ARG_TYPE = const TYPE&>
 class CVynArray {
  public:
   using value_type = TYPE;
-  using iterator = typename std::vector<TYPE>::iterator;
-  using const_iterator = typename std::vector<TYPE>::const_iterator;
+  using iterator = TYPE*;
+  using const_iterator = const TYPE*;
 
   // Size.
   int GetSize() const noexcept { return static_cast<int>(items_.size()); }
@@ -59,7 +61,7 @@ class CVynArray {
   int Append(const CVynArray& other) {
     const int first = GetSize();
     if (&other == this) {
-      const std::vector<TYPE> copy(items_);
+      const CompactVector<TYPE> copy(items_);
       items_.insert(items_.end(), copy.begin(), copy.end());
     } else {
       items_.insert(items_.end(), other.items_.begin(), other.items_.end());
@@ -106,7 +108,7 @@ class CVynArray {
     return value;
   }
 
-  std::vector<TYPE> items_;
+  CompactVector<TYPE> items_;
 };
 
 }  // namespace vyn_templ

@@ -5,7 +5,8 @@
 #include <memory>
 #include <type_traits>
 #include <utility>
-#include <vector>
+
+#include "hostlibs/VynCompactVector.h"
 
 namespace vyn::ie {
 
@@ -41,7 +42,7 @@ struct DexCopyByClone {
 // item pointers (const pointers through a const list).
 template <class T, class CopyPolicy = DexCopyByConstructor>
 class DexOwningList {
-  using Storage = std::vector<std::unique_ptr<T>>;
+  using Storage = vyn_templ::CompactVector<std::unique_ptr<T>>;
 
   template <bool IsConst>
   class Iterator {
