@@ -122,9 +122,14 @@ void PointFileExporter::writeHeader() {
 void PointFileExporter::writePoint(const DexDesignPoint& point) {
   const DexStation& station = point.getStation();
   const bool horizontal = station.isHorizCoordsDefined();
-  const auto number = [this](double meters, int decimalsIndex) {
-    return utils::distByStyleToString(layout_.units, meters,
-                                      layout_.decimals[static_cast<std::size_t>(decimalsIndex)]);
+  // A number column: the value in the layout's units and decimals, or empty when it is undefined.
+  const auto appendNumber = [this](std::size_t column, bool defined, double meters, int decimalsIndex) {
+    value_.clear();
+    if (defined) {
+      utils::appendDistByStyle(value_, layout_.units, meters,
+                               layout_.decimals[static_cast<std::size_t>(decimalsIndex)]);
+    }
+    appendValue(column, value_, false);
   };
   line_.clear();
   for (std::size_t column = 0; column < layout_.fields.size(); ++column) {
@@ -133,21 +138,16 @@ void PointFileExporter::writePoint(const DexDesignPoint& point) {
         appendValue(column, point.getName().view(), true);
         break;
       case EColumn::NORTH:
-        appendValue(column, horizontal ? number(station.getX(), 0).view() : std::wstring_view(), false);
+        appendNumber(column, horizontal, station.getX(), 0);
         break;
       case EColumn::EAST:
-        appendValue(column, horizontal ? number(station.getY(), 1).view() : std::wstring_view(), false);
+        appendNumber(column, horizontal, station.getY(), 1);
         break;
       case EColumn::HEIGHT:
-        appendValue(column,
-                    station.isHeightDefined() ? number(station.getZ(), 2).view() : std::wstring_view(),
-                    false);
+        appendNumber(column, station.isHeightDefined(), station.getZ(), 2);
         break;
       case EColumn::GEOID_HEIGHT:
-        appendValue(
-            column,
-            station.isGeoidHeightDefined() ? number(station.getGeoidHeight(), 2).view() : std::wstring_view(),
-            false);
+        appendNumber(column, station.isGeoidHeightDefined(), station.getGeoidHeight(), 2);
         break;
       case EColumn::NOTES:
         appendValue(column, station.getNotes().view(), true);

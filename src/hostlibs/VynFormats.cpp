@@ -17,14 +17,17 @@ namespace vyn_formats {
 namespace {
 
 using detail::parseDecimal;
-using detail::widenAscii;
 
 constexpr int kMaxDecimals = 100;
 // Sign, the 309 digits of the largest double, the point and the decimals.
 constexpr std::size_t kFixedCapacity = 1 + 309 + 1 + kMaxDecimals + 8;
 
 CVynStringT<wchar_t> toWide(std::string_view text) {
-  return CVynStringT<wchar_t>(widenAscii(text));
+  CVynStringT<wchar_t> wide;
+  const int length = static_cast<int>(text.size());
+  std::copy(text.begin(), text.end(), wide.GetBuffer(length));
+  wide.ReleaseBuffer(length);
+  return wide;
 }
 
 CVynStringT<wchar_t> nonFiniteText(double value) {
@@ -35,6 +38,18 @@ CVynStringT<wchar_t> nonFiniteText(double value) {
 // "-0.000" and the like: a minus sign before nothing but zeros.
 bool isNegativeZeroText(std::string_view text) {
   return !text.empty() && text.front() == '-' && text.find_first_not_of("0.", 1) == std::string_view::npos;
+}
+
+using FixedBuffer = std::array<char, kFixedCapacity>;
+
+// The fixed-notation text of a finite value in buffer.
+std::string_view fixedText(FixedBuffer& buffer, double value, int decimals) {
+  const auto result = std::to_chars(buffer.data(), buffer.data() + buffer.size(), value,
+                                    std::chars_format::fixed, std::clamp(decimals, 0, kMaxDecimals));
+  if (result.ec != std::errc()) return {};
+  std::string_view text(buffer.data(), static_cast<std::size_t>(result.ptr - buffer.data()));
+  if (isNegativeZeroText(text)) text.remove_prefix(1);
+  return text;
 }
 
 template <typename Integer>
@@ -59,14 +74,18 @@ CVynStringT<wchar_t> DoubleToString(double value) {
 
 CVynStringT<wchar_t> DoubleToString(double value, int decimals) {
   if (!std::isfinite(value)) return nonFiniteText(value);
-  decimals = std::clamp(decimals, 0, kMaxDecimals);
-  std::array<char, kFixedCapacity> buffer{};
-  const auto result =
-      std::to_chars(buffer.data(), buffer.data() + buffer.size(), value, std::chars_format::fixed, decimals);
-  if (result.ec != std::errc()) return {};
-  std::string_view text(buffer.data(), static_cast<std::size_t>(result.ptr - buffer.data()));
-  if (isNegativeZeroText(text)) text.remove_prefix(1);
-  return toWide(text);
+  FixedBuffer buffer;
+  return toWide(fixedText(buffer, value, decimals));
+}
+
+void AppendDoubleToString(std::wstring& out, double value, int decimals) {
+  if (!std::isfinite(value)) {
+    out += nonFiniteText(value).view();
+    return;
+  }
+  FixedBuffer buffer;
+  const std::string_view text = fixedText(buffer, value, decimals);
+  out.append(text.begin(), text.end());
 }
 
 CVynStringT<wchar_t> IntToString(int value) {

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <cstdio>
+#include <string>
 
 #include "hostlibs/DexApi.h"
 #include "hostlibs/VynString.h"
@@ -23,6 +24,9 @@ DEX_API CVynStringT<wchar_t> DoubleToString(double value);
 // is written in full: the largest, the no-value marker, has 309 digits before the point. NaN gives
 // "nan", the infinities "inf" and "-inf".
 DEX_API CVynStringT<wchar_t> DoubleToString(double value, int decimals);
+// Appends what DoubleToString(value, decimals) answers to out, without a string of its own: for
+// writers of many numbers.
+DEX_API void AppendDoubleToString(std::wstring& out, double value, int decimals);
 
 DEX_API CVynStringT<wchar_t> IntToString(int value);
 DEX_API CVynStringT<wchar_t> UIntToString(unsigned value);

@@ -174,6 +174,15 @@ CVynStringT<wchar_t> distByStyleToString(EDistUnits units, double meters, int de
   return doubleToString(fromMetersFactor(meters, units), decimals);
 }
 
+void appendDistByStyle(std::wstring& out, EDistUnits units, double meters, int decimals) {
+  const double value = fromMetersFactor(meters, units);
+  if (decimals < 0) {
+    out += vyn_formats::DoubleToString(value).view();
+  } else {
+    vyn_formats::AppendDoubleToString(out, value, decimals);
+  }
+}
+
 bool doubleToStringWithExp(double value, CVynStringT<wchar_t>& out) {
   if (value == 0.0) {
     out = L"0.00000000000000000E+00";

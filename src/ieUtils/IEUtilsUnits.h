@@ -1,5 +1,7 @@
 #pragma once
 
+#include <string>
+
 #include <cstdint>
 #include <limits>
 
@@ -130,6 +132,9 @@ DEX_API CVynStringT<wchar_t> intToString(int value);
 DEX_API CVynStringT<wchar_t> angleByStyleToString(EAngleUnits units, double decDeg, int decimals);
 // doubleToString(fromMetersFactor(meters, units), decimals).
 DEX_API CVynStringT<wchar_t> distByStyleToString(EDistUnits units, double meters, int decimals);
+// Appends what distByStyleToString answers to out, without a string of its own: for writers of many
+// numbers.
+DEX_API void appendDistByStyle(std::wstring& out, EDistUnits units, double meters, int decimals);
 
 // A fixed scientific form with the mantissa below 1 and 17 digits after its point:
 // "0.12345600000000000E+03" for 123.456, "-.50000000000000000E-01" for -0.05 (a negative value puts

@@ -138,6 +138,22 @@ TEST(DistanceConversion, WritesInTheUnitWithTheGivenDecimals) {
   EXPECT_EQ(text(utils::distByStyleToString(EDistUnits::USFEET, kNoValue, -1)), L"1.7976931348623157e+308");
 }
 
+TEST(DistanceConversion, AppendingWritesWhatTheStringFormAnswers) {
+  const double values[] = {30.48, -0.0001, 1234.5, kNoValue, -kNoValue, std::nan(""), 0.125};
+  const int decimals[] = {-1, 0, 2, 3, 150};
+  std::wstring out = L"kept:";
+  std::wstring expected = out;
+  for (const double value : values) {
+    for (const int places : decimals) {
+      utils::appendDistByStyle(out, EDistUnits::IFEET, value, places);
+      expected += text(utils::distByStyleToString(EDistUnits::IFEET, value, places));
+      out += L';';
+      expected += L';';
+    }
+  }
+  EXPECT_EQ(out, expected);
+}
+
 // ---- Angle conversions --------------------------------------------------------------------------
 
 TEST(AngleConversion, EachUnitUsesItsHostConversion) {
