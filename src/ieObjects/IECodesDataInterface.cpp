@@ -1,5 +1,6 @@
 #include "ieObjects/IECodesDataInterface.h"
 
+#include <algorithm>
 #include <cstddef>
 #include <string_view>
 
@@ -208,19 +209,23 @@ CVynStringT<wchar_t> DexCodeValues::getCodeStringAt(int index) const {
 }
 
 CVynStringT<wchar_t> DexCodeValues::getControlCode(int place) const {
-  if (!isControlCodePlace(place)) return {};
-  return controlCodes_[static_cast<std::size_t>(place)];
+  if (!isControlCodePlace(place) || !controlCodes_) return {};
+  return (*controlCodes_.get())[static_cast<std::size_t>(place)];
 }
 
 void DexCodeValues::setControlCode(int place, const CVynStringT<wchar_t>& controlCode) {
-  if (isControlCodePlace(place)) controlCodes_[static_cast<std::size_t>(place)] = controlCode;
+  if (!isControlCodePlace(place)) return;
+  if (!controlCodes_) {
+    if (controlCode.IsEmpty()) return;
+    controlCodes_.reset(new std::array<CVynStringT<wchar_t>, kNumberOfControlCodes>());
+  }
+  (*controlCodes_.get())[static_cast<std::size_t>(place)] = controlCode;
 }
 
 bool DexCodeValues::doesCodeHasControlCode(const CVynStringT<wchar_t>& controlCode) const {
-  for (const auto& held : controlCodes_) {
-    if (held == controlCode) return true;
-  }
-  return false;
+  if (!controlCodes_) return controlCode.IsEmpty();
+  const auto& held = *controlCodes_.get();
+  return std::find(held.begin(), held.end(), controlCode) != held.end();
 }
 
 // DexCodesDataInterface

@@ -6,6 +6,7 @@
 #include "hostlibs/VynAlloc.h"
 #include "hostlibs/VynArray.h"
 #include "hostlibs/VynString.h"
+#include "ieObjects/IEOwnedPointer.h"
 #include "ieObjects/IEOwningList.h"
 #include "ieUtils/IEAsciiFields.h"
 
@@ -113,7 +114,8 @@ class DEX_API DexCodeValues {
   StringList attrs_;
   const DexCodeDescription* description_ = nullptr;
   StringList codeStrings_;
-  std::array<CVynStringT<wchar_t>, kNumberOfControlCodes> controlCodes_;
+  // Most codes carry no control code: the three texts get a block when the first is set.
+  DexOwnedPointer<std::array<CVynStringT<wchar_t>, kNumberOfControlCodes>> controlCodes_;
 };
 
 // The codes of one survey object (and of some raw observations), in order. The same code may occur

@@ -33,6 +33,34 @@ namespace vyn::ie {
 
 // ---- DexStation ---------------------------------------------------------------------------------
 
+struct DexStation::Texts {
+  CVynStringT<wchar_t> notes;
+  CVynStringT<wchar_t> timeStamps;
+  CVynStringT<wchar_t> id;
+};
+
+namespace {
+const CVynStringT<wchar_t> kNoText;
+}  // namespace
+
+DexStation::Texts& DexStation::textsToWrite() {
+  if (!texts_) texts_.reset(new Texts());
+  return *texts_.get();
+}
+
+const CVynStringT<wchar_t>& DexStation::getNotes() const noexcept {
+  return texts() != nullptr ? texts()->notes : kNoText;
+}
+void DexStation::setNotes(const CVynStringT<wchar_t>& notes) {
+  if (texts() != nullptr || !notes.IsEmpty()) textsToWrite().notes = notes;
+}
+const CVynStringT<wchar_t>& DexStation::getTimeStamps() const noexcept {
+  return texts() != nullptr ? texts()->timeStamps : kNoText;
+}
+void DexStation::setTimeStamps(const CVynStringT<wchar_t>& timeStamps) {
+  if (texts() != nullptr || !timeStamps.IsEmpty()) textsToWrite().timeStamps = timeStamps;
+}
+
 DexStation::DexStation(unsigned int stationAttrs, EDexCSType csType)
     : stationAttrs_(stationAttrs), csType_(csType) {}
 
@@ -51,10 +79,8 @@ DexStation& DexStation::operator=(const DexStation& other) {
 DexStation::~DexStation() = default;
 
 void DexStation::reset() {
-  notes_.Empty();
-  timeStamps_.Empty();
+  texts_.reset();
   name_.Empty();
-  id_.Empty();
   heightDefined_ = true;
   horizCoordsDefined_ = true;
   geoidHeightDefined_ = false;
@@ -70,8 +96,8 @@ void DexStation::shiftCoords(const DexPosition3D& origin, double scaleX, double 
 }
 
 void DexStation::copy(const DexStation& other) {
-  notes_ = other.notes_;
-  timeStamps_ = other.timeStamps_;
+  setNotes(other.getNotes());
+  setTimeStamps(other.getTimeStamps());
   setName(other.getName());
   stationAttrs_ = other.stationAttrs_;
   heightDefined_ = other.isHeightDefined();
@@ -96,11 +122,11 @@ const CVynStringT<wchar_t>& DexStation::getName() const {
 }
 
 void DexStation::setId(const CVynStringT<wchar_t>& id) {
-  id_ = id;
+  if (texts() != nullptr || !id.IsEmpty()) textsToWrite().id = id;
 }
 
 const CVynStringT<wchar_t>& DexStation::getId() const {
-  return id_;
+  return texts() != nullptr ? texts()->id : kNoText;
 }
 
 bool DexStation::isHorizCoordsDefined() const {
@@ -146,7 +172,8 @@ void DexStation::addPointAttr(unsigned int flag) {
 
 bool DexStation::operator==(const DexStation& other) const {
   if (!DexPosition3D::operator==(other)) return false;
-  if (notes_ != other.notes_ || timeStamps_ != other.timeStamps_ || name_ != other.name_) return false;
+  if (getNotes() != other.getNotes() || getTimeStamps() != other.getTimeStamps() || name_ != other.name_)
+    return false;
   if (stationAttrs_ != other.stationAttrs_ || isHeightDefined() != other.isHeightDefined()) return false;
   if (geoidHeightDefined_ != other.geoidHeightDefined_) return false;
   if (geoidHeightDefined_ && !matchesWithin(geoidHeight_, other.geoidHeight_, kStationTolerance))

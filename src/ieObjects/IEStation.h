@@ -5,6 +5,7 @@
 #include "hostlibs/VynString.h"
 #include "ieObjects/IECoords.h"
 #include "ieObjects/IEInterfaces.h"
+#include "ieObjects/IEOwnedPointer.h"
 #include "ieObjects/IETypedValues.h"
 
 namespace vyn::ie {
@@ -121,10 +122,10 @@ class DEX_API DexStation : public DexPosition3D,
   // ---- Further properties ---------------------------------------------------------------------
   EDexCSType getCSType() const noexcept { return csType_; }
   void setCSType(EDexCSType csType) noexcept { csType_ = csType; }
-  const CVynStringT<wchar_t>& getNotes() const noexcept { return notes_; }
-  void setNotes(const CVynStringT<wchar_t>& notes) { notes_ = notes; }
-  const CVynStringT<wchar_t>& getTimeStamps() const noexcept { return timeStamps_; }
-  void setTimeStamps(const CVynStringT<wchar_t>& timeStamps) { timeStamps_ = timeStamps; }
+  const CVynStringT<wchar_t>& getNotes() const noexcept;
+  void setNotes(const CVynStringT<wchar_t>& notes);
+  const CVynStringT<wchar_t>& getTimeStamps() const noexcept;
+  void setTimeStamps(const CVynStringT<wchar_t>& timeStamps);
   double getBulge() const noexcept { return bulge_; }
   void setBulge(double bulge) noexcept { bulge_ = bulge; }
   double getScaleFactor() const noexcept { return scaleFactor_; }
@@ -138,12 +139,16 @@ class DEX_API DexStation : public DexPosition3D,
   bool operator!=(const DexStation& other) const { return !(*this == other); }
 
  private:
+  // Notes, time stamps and id are empty in most stations (every polyline vertex is one), so they
+  // share one block, made when the first of them is set.
+  struct Texts;
+  const Texts* texts() const noexcept { return texts_.get(); }
+  Texts& textsToWrite();
+
   unsigned int stationAttrs_ = 1u << POINT_ATTR_DESIGN;
   EDexCSType csType_ = CS_LOCAL;
-  CVynStringT<wchar_t> notes_;
-  CVynStringT<wchar_t> timeStamps_;
   CVynStringT<wchar_t> name_;
-  CVynStringT<wchar_t> id_;
+  DexOwnedPointer<Texts> texts_;
   bool heightDefined_ = true;
   bool horizCoordsDefined_ = true;
   bool geoidHeightDefined_ = false;

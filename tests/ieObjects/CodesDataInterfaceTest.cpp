@@ -248,6 +248,25 @@ TEST(DexCodeValues, HasAControlCodeThatEqualsOneOfTheThree) {
   EXPECT_FALSE(code.doesCodeHasControlCode(L""));
 }
 
+// A code without control codes answers as one whose three places are empty, also through copies.
+TEST(DexCodeValues, ACodeWithoutControlCodesHasThreeEmptyPlaces) {
+  DexCodeValues bare(nullptr);
+  bare.setControlCode(DexCodeValues::SECOND_CONTROL_CODE, L"");
+  EXPECT_TRUE(bare.doesCodeHasControlCode(L""));
+  EXPECT_FALSE(bare.doesCodeHasControlCode(L"AS"));
+  EXPECT_EQ(L"", bare.getControlCode(DexCodeValues::THIRD_CONTROL_CODE));
+
+  DexCodeValues marked(nullptr);
+  marked.setControlCode(DexCodeValues::THIRD_CONTROL_CODE, L"AE");
+  DexCodeValues copy(marked);
+  marked.setControlCode(DexCodeValues::THIRD_CONTROL_CODE, L"R");
+  EXPECT_EQ(L"AE", copy.getControlCode(DexCodeValues::THIRD_CONTROL_CODE));
+  EXPECT_TRUE(copy.doesCodeHasControlCode(L""));
+  copy = bare;
+  EXPECT_FALSE(copy.doesCodeHasControlCode(L"AE"));
+  EXPECT_EQ(L"R", marked.getControlCode(DexCodeValues::THIRD_CONTROL_CODE));
+}
+
 TEST(DexCodeValues, AnEmptyControlCodeMatchesAnEmptyPlace) {
   DexCodeValues code(nullptr);
   code.setControlCode(DexCodeValues::FIRST_CONTROL_CODE, L"AS");

@@ -340,6 +340,26 @@ TEST(DexStation, CopyTakesEverythingButTheCoordinates) {
   expectSameProperties(target, source);
 }
 
+// Stations without notes, time stamps or id keep none of their own; a copy from one empties them.
+TEST(DexStation, CopyFromAStationWithoutTextsEmptiesThemAndCopiesAreIndependent) {
+  DexStation target = filledStation();
+  target.copy(DexStation());
+  EXPECT_EQ(target.getNotes(), L"");
+  EXPECT_EQ(target.getTimeStamps(), L"");
+  EXPECT_EQ(target.getId(), L"");
+  EXPECT_EQ(target, DexStation(target));
+
+  DexStation source = filledStation();
+  const DexStation copy(source);
+  source.setNotes(L"changed");
+  source.setId(L"");
+  EXPECT_EQ(copy.getNotes(), L"note");
+  EXPECT_EQ(copy.getId(), L"id-1");
+  source.reset();
+  EXPECT_EQ(source.getTimeStamps(), L"");
+  EXPECT_EQ(copy.getTimeStamps(), L"2024-03-01 12:00");
+}
+
 TEST(DexStation, CopyOfAStationWithoutGeoidHeightKeepsTheTargetsValue) {
   DexStation source;
   DexStation target;
