@@ -183,11 +183,7 @@ wchar_t* String::writableChars() {
 
 void String::assign(std::wstring_view text) {
   if (text.empty()) {
-    if (chars_ != nullptr && header()->capacity > 0) {
-      setLength(0);
-    } else {
-      chars_ = nullptr;
-    }
+    Empty();
     return;
   }
   // An owned block large enough is reused (text may lie inside it, hence the move).
@@ -295,8 +291,13 @@ int String::GetLength() const noexcept {
 bool String::IsEmpty() const noexcept {
   return length() == 0;
 }
+// Keeps an owned block for the next text, as a reused line buffer wants.
 void String::Empty() noexcept {
-  release();
+  if (chars_ != nullptr && header()->capacity > 0) {
+    setLength(0);
+  } else {
+    chars_ = nullptr;
+  }
 }
 
 wchar_t String::GetAt(int index) const noexcept {

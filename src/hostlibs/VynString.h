@@ -60,7 +60,7 @@ class DEX_API CVynStringT<wchar_t> {
   // Size and access.
   int GetLength() const noexcept;
   bool IsEmpty() const noexcept;
-  void Empty() noexcept;
+  void Empty() noexcept;  // keeps the memory for the next text
   wchar_t GetAt(int index) const noexcept;       // 0 outside the text
   wchar_t operator[](int index) const noexcept;  // as GetAt
   void SetAt(int index, wchar_t ch) noexcept;    // ignored outside the text
