@@ -16,8 +16,10 @@ namespace vyn_templ {
 // they do in std::vector. T must be move-constructible; a failed allocation throws std::bad_alloc.
 template <class T>
 class CompactVector {
+  // NOLINTBEGIN(misc-redundant-expression): the sides are equal only when T is pointer-sized
   static constexpr std::uint32_t kInlineCapacity =
       sizeof(T) <= sizeof(void*) && alignof(T) <= alignof(void*) ? 1 : 0;
+  // NOLINTEND(misc-redundant-expression)
 
  public:
   using value_type = T;
@@ -124,7 +126,7 @@ class CompactVector {
   }
   T* insert(const T* position, std::size_t count, const T& item) {
     const std::size_t index = indexOf(position);
-    const T copy(item);  // item may live in this vector
+    const T copy(item);  // NOLINT(performance-unnecessary-copy-initialization): item may live in this vector
     reserve(size_ + count);
     for (std::size_t i = 0; i < count; ++i)
       push_back(copy);
