@@ -8,6 +8,7 @@
 #include "hostlibs/TextFile.h"
 #include "hostlibs/VynAlloc.h"
 #include "hostlibs/VynArray.h"
+#include "hostlibs/VynCompactVector.h"
 #include "hostlibs/VynFormats.h"
 #include "hostlibs/VynLibrary.h"
 #include "hostlibs/VynLogging.h"

@@ -357,7 +357,10 @@ int String::CompareNoCase(const wchar_t* text) const noexcept {
 // The rarer edits rebuild the text; the frequent ones (trimming, case, Replace of a character) work in
 // place.
 int String::Insert(int index, wchar_t ch) {
-  return Insert(index, std::wstring(1, ch).c_str());
+  std::wstring edited(view());
+  edited.insert(clampIndex(index, edited.size()), 1, ch);
+  assign(edited);
+  return GetLength();
 }
 int String::Insert(int index, const wchar_t* text) {
   std::wstring edited(view());
