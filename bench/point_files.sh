@@ -2,6 +2,8 @@
 # Import and export of a million coded points through the loader and the shipped point-file plug-ins,
 # with the baselines run on the same file and machine:
 #   - a bare fread + splitter + std::from_chars parse, and a bare std::to_chars write;
+#   - the model's heap blocks of a million coded points allocated and written, nothing parsed (the
+#     floor of any import into the model on this machine);
 #   - ogr2ogr from Debian's gdal-bin reading the file into memory (-f Memory) and writing it (-f CSV);
 #     installed when missing, skipped when it cannot be.
 # Each benchmark runs in a process of its own so that its peak memory is its own.
@@ -22,7 +24,7 @@ bench=$build/bench/dexchange_bench_PointFilesBench
 tool=$build/tools/dexchange/dexchange
 
 echo "== the library, a million points (file: $DEXCHANGE_BENCH_CSV)"
-for name in BareParse LoaderImport BareWrite LoaderExport; do
+for name in BareParse ModelBlocks LoaderImport BareWrite LoaderExport; do
   "$bench" --benchmark_filter="^$name/" --benchmark_counters_tabular=true 2>/dev/null | grep -E "^(Benchmark|$name)"
 done
 
