@@ -22,10 +22,19 @@ cmake -S "$root" -B "$build" -DCMAKE_BUILD_TYPE=Release -DDEXCHANGE_BENCH=ON -DD
 cmake --build "$build" -j"$jobs" --target dexchange_bench_PointFilesBench dexchange_tool >/dev/null
 bench=$build/bench/dexchange_bench_PointFilesBench
 tool=$build/tools/dexchange/dexchange
+huge=glibc.malloc.hugetlb=1:glibc.malloc.arena_max=1
 
 echo "== the library, a million points (file: $DEXCHANGE_BENCH_CSV)"
 for name in BareParse ModelBlocks LoaderImport BareWrite LoaderExport; do
   "$bench" --benchmark_filter="^$name/" --benchmark_counters_tabular=true 2>/dev/null | grep -E "^(Benchmark|$name)"
+done
+# Page faults are most of an import's time: the same with glibc's heap on transparent huge pages, as
+# the tool runs (a host may set the variable too).
+echo
+echo "== the same imports with GLIBC_TUNABLES=$huge"
+for name in ModelBlocks LoaderImport; do
+  GLIBC_TUNABLES=$huge "$bench" --benchmark_filter="^$name/" --benchmark_counters_tabular=true 2>/dev/null \
+    | grep -E "^$name"
 done
 
 # wall and CPU (user + system) seconds and peak MB of a command; on a shared machine the CPU time is
@@ -40,6 +49,7 @@ echo
 echo "== the tool (worker threads, whole process)"
 echo "dexchange info (import):            $(measure "$tool" info "$DEXCHANGE_BENCH_CSV")"
 echo "dexchange convert (import, export): $(measure "$tool" convert "$DEXCHANGE_BENCH_CSV" "$work/out.csv" --force)"
+echo "dexchange info, glibc defaults:     $(GLIBC_TUNABLES= measure "$tool" info "$DEXCHANGE_BENCH_CSV")"
 
 echo
 echo "== ogr2ogr (gdal-bin)"
