@@ -8,9 +8,9 @@
 
 namespace vyn_templ {
 
-// An MFC-style growable array (one short item held without a heap block). Indexes are ints. Reading past the
-// end answers a default element and writing past the end does nothing (SetAtGrow grows instead), so a bad
-// index from a field file never crashes a plug-in.
+// An MFC-style growable array; one item of pointer size is held without a heap block. Indexes are
+// ints. Reading past the end answers a default element and writing past the end does nothing
+// (SetAtGrow grows instead), so a bad index from a field file never crashes a plug-in.
 template <class TYPE, class ARG_TYPE = const TYPE&>
 class CVynArray {
  public:

@@ -1,9 +1,8 @@
 #pragma once
 
-#include <string>
-
 #include <cstdint>
 #include <limits>
+#include <string>
 
 #include "hostlibs/DexApi.h"
 #include "hostlibs/VynString.h"
