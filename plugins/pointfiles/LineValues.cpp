@@ -78,15 +78,11 @@ void LineSplitter::splitDelimited(std::wstring_view line) {
         }
         text_ += line[position++];
       }
-      // Anything between the closing quote and the delimiter belongs to the value.
-      const std::size_t end = std::min(line.find(delimiter, position), line.size());
-      text_ += trimmed(line.substr(position, end - position));
-      position = end;
-    } else {
-      const std::size_t end = std::min(line.find(delimiter, position), line.size());
-      text_ += trimmed(line.substr(position, end - position));
-      position = end;
     }
+    // The value up to the delimiter; after a closing quote, whatever stands before the delimiter too.
+    const std::size_t end = std::min(line.find(delimiter, position), line.size());
+    text_ += trimmed(line.substr(position, end - position));
+    position = end;
     spans_.emplace_back(start, text_.size() - start);
     if (position >= line.size()) break;
     ++position;  // the delimiter

@@ -15,28 +15,6 @@ namespace {
 constexpr int kPointsPerStep = 16384;
 constexpr wchar_t kQuote = L'"';
 
-// Appends text to out as UTF-8.
-void appendUtf8(std::wstring_view text, std::string& out) {
-  for (const wchar_t ch : text) {
-    const auto code = static_cast<char32_t>(ch);
-    if (code < 0x80) {
-      out += static_cast<char>(code);
-    } else if (code < 0x800) {
-      out += static_cast<char>(0xC0 | (code >> 6));
-      out += static_cast<char>(0x80 | (code & 0x3F));
-    } else if (code < 0x10000) {
-      out += static_cast<char>(0xE0 | (code >> 12));
-      out += static_cast<char>(0x80 | ((code >> 6) & 0x3F));
-      out += static_cast<char>(0x80 | (code & 0x3F));
-    } else {
-      out += static_cast<char>(0xF0 | ((code >> 18) & 0x07));
-      out += static_cast<char>(0x80 | ((code >> 12) & 0x3F));
-      out += static_cast<char>(0x80 | ((code >> 6) & 0x3F));
-      out += static_cast<char>(0x80 | (code & 0x3F));
-    }
-  }
-}
-
 bool needsQuotes(std::wstring_view value, wchar_t delimiter) {
   if (value.empty()) return false;
   const auto isBlank = [](wchar_t ch) { return ch == L' ' || ch == L'\t'; };
@@ -116,7 +94,7 @@ void PointFileExporter::writeHeader() {
   for (std::size_t column = 0; column < layout_.fields.size(); ++column)
     appendValue(column, ascii_fields::typeToField(layout_.fields[column].type).view(), false);
   line_ += L"\r\n";
-  appendUtf8(line_, bytes_);
+  vyn_text::appendUtf8(bytes_, line_);
 }
 
 void PointFileExporter::writePoint(const DexDesignPoint& point) {
@@ -174,7 +152,7 @@ void PointFileExporter::writePoint(const DexDesignPoint& point) {
     }
   }
   line_ += L"\r\n";
-  appendUtf8(line_, bytes_);
+  vyn_text::appendUtf8(bytes_, line_);
 }
 
 void PointFileExporter::appendValue(std::size_t column, std::wstring_view value, bool isText) {

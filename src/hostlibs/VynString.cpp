@@ -579,5 +579,9 @@ std::string toUtf8(const wchar_t* text) {
 std::string toUtf8(std::wstring_view text) {
   return detail::toUtf8(text);
 }
+void appendUtf8(std::string& out, std::wstring_view text) {
+  for (const wchar_t ch : text)
+    detail::appendUtf8(out, ch);
+}
 
 }  // namespace vyn_text

@@ -60,7 +60,7 @@ class DEX_API CVynStringT<wchar_t> {
   // Size and access.
   int GetLength() const noexcept;
   bool IsEmpty() const noexcept;
-  void Empty() noexcept;  // keeps the memory for the next text
+  void Empty() noexcept;                         // keeps the memory for the next text
   wchar_t GetAt(int index) const noexcept;       // 0 outside the text
   wchar_t operator[](int index) const noexcept;  // as GetAt
   void SetAt(int index, wchar_t ch) noexcept;    // ignored outside the text
@@ -205,6 +205,8 @@ inline bool operator>=(const wchar_t* a, const CVynStringT<wchar_t>& b) noexcept
 // UTF-8 form of a wide text (a null pointer gives ""); lone surrogates become U+FFFD.
 DEX_API std::string toUtf8(const wchar_t* text);
 DEX_API std::string toUtf8(std::wstring_view text);
+// Appends the UTF-8 form of text to out, for writers that gather many texts in one buffer.
+DEX_API void appendUtf8(std::string& out, std::wstring_view text);
 
 }  // namespace vyn_text
 

@@ -185,6 +185,12 @@ TEST(CVynString, NarrowTextIsDecodedByCodePage) {
   EXPECT_TRUE(String(static_cast<const char*>(nullptr), vyn_text::CP_UTF8).IsEmpty());
   EXPECT_EQ(vyn_text::toUtf8(L"Vy\u0148 \U0001F4CD"), "Vy\xC5\x88 \xF0\x9F\x93\x8D");
   EXPECT_EQ(vyn_text::toUtf8(static_cast<const wchar_t*>(nullptr)), "");
+  // Appending keeps what the buffer holds; a lone surrogate becomes U+FFFD, never invalid UTF-8.
+  std::string bytes = "kept;";
+  const wchar_t loneSurrogate[] = {L'a', static_cast<wchar_t>(0xD800), L'\0'};
+  vyn_text::appendUtf8(bytes, loneSurrogate);
+  vyn_text::appendUtf8(bytes, L"\u0148");
+  EXPECT_EQ(bytes, "kept;a\xEF\xBF\xBD\xC5\x88");
 }
 
 TEST(CVynString, FormatRendersPrintfStyleText) {

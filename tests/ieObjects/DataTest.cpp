@@ -347,46 +347,42 @@ TEST(DataDictionaries, AttachingReplacesAndDeletesTheOldDictionary) {
   EXPECT_EQ(second, data.getIEDataDictionary());
 }
 
-TEST(DataDictionaries, RoadTemplatesAndAlignmentPartsIgnoreNullAndTheHeldPointer) {
-  DeletionLog deleted;
-  DexData data(DexSettings{});
-  auto* const templates = new Recorded<DexRoadTemplatesDictionary>(deleted, "templates", true, false);
-  data.attachIERoadTemplatesDictionary(templates);
-  data.attachIERoadTemplatesDictionary(templates);
-  data.attachIERoadTemplatesDictionary(nullptr);
-  EXPECT_EQ(templates, data.getIERoadTemplatesDictionary());
-
-  auto* const parts = new Recorded<DexAlignmentPartsDictionary>(deleted, "parts");
-  data.attachIEAlignmentPartsDictionary(parts);
-  data.attachIEAlignmentPartsDictionary(parts);
-  data.attachIEAlignmentPartsDictionary(nullptr);
-  EXPECT_EQ(parts, data.getIEAlignmentPartsDictionary());
-  EXPECT_TRUE(deleted.empty());
-
-  data.attachIERoadTemplatesDictionary(new DexRoadTemplatesDictionary(false, false));
-  data.attachIEAlignmentPartsDictionary(new DexAlignmentPartsDictionary());
-  EXPECT_EQ((DeletionLog{"templates", "parts"}), deleted);
+// Attaches held, then held again and null (neither may delete it), checks it is the one held, and
+// finally attaches a fresh dictionary, which must delete it.
+template <class Dictionary, class Attach, class Get>
+void expectAttachKeepsTheHeldUntilReplaced(DexData& data, const DeletionLog& deleted, Attach attach, Get get,
+                                           Dictionary* held, Dictionary* replacement) {
+  const std::size_t deletedBefore = deleted.size();
+  (data.*attach)(held);
+  (data.*attach)(held);
+  (data.*attach)(nullptr);
+  EXPECT_EQ(held, (data.*get)());
+  EXPECT_EQ(deletedBefore, deleted.size());
+  (data.*attach)(replacement);
 }
 
-TEST(DataDictionaries, LayersAndLocalizationIgnoreNullAndTheHeldPointer) {
+TEST(DataDictionaries, OtherDictionariesIgnoreNullAndTheHeldPointer) {
   DeletionLog deleted;
   DexData data(DexSettings{});
-  auto* const layers = new Recorded<DexDrawDictionary>(deleted, "layers");
-  data.attachIELayers(layers);
-  data.attachIELayers(layers);
-  data.attachIELayers(nullptr);
-  EXPECT_EQ(layers, data.getIEDrawDictionary());
-
-  auto* const localization = new Recorded<DexLocalization>(deleted, "localization");
-  data.attachIELocalization(localization);
-  data.attachIELocalization(localization);
-  data.attachIELocalization(nullptr);
-  EXPECT_EQ(localization, data.getIELocalization());
-  EXPECT_TRUE(deleted.empty());
-
-  data.attachIELayers(new DexDrawDictionary());
-  data.attachIELocalization(new DexLocalization());
-  EXPECT_EQ((DeletionLog{"layers", "localization"}), deleted);
+  using Templates = DexRoadTemplatesDictionary;
+  using Parts = DexAlignmentPartsDictionary;
+  expectAttachKeepsTheHeldUntilReplaced<Templates>(
+      data, deleted, &DexData::attachIERoadTemplatesDictionary,
+      static_cast<Templates* (DexData::*)()>(&DexData::getIERoadTemplatesDictionary),
+      new Recorded<Templates>(deleted, "templates", true, false), new Templates(false, false));
+  expectAttachKeepsTheHeldUntilReplaced<Parts>(
+      data, deleted, &DexData::attachIEAlignmentPartsDictionary,
+      static_cast<Parts* (DexData::*)()>(&DexData::getIEAlignmentPartsDictionary),
+      new Recorded<Parts>(deleted, "parts"), new Parts());
+  expectAttachKeepsTheHeldUntilReplaced<DexDrawDictionary>(
+      data, deleted, &DexData::attachIELayers,
+      static_cast<DexDrawDictionary* (DexData::*)()>(&DexData::getIEDrawDictionary),
+      new Recorded<DexDrawDictionary>(deleted, "layers"), new DexDrawDictionary());
+  expectAttachKeepsTheHeldUntilReplaced<DexLocalization>(
+      data, deleted, &DexData::attachIELocalization,
+      static_cast<DexLocalization* (DexData::*)()>(&DexData::getIELocalization),
+      new Recorded<DexLocalization>(deleted, "localization"), new DexLocalization());
+  EXPECT_EQ((DeletionLog{"templates", "parts", "layers", "localization"}), deleted);
 }
 
 TEST(DataDictionaries, StationEquationSetsAttachNullToDropTheHeldDictionary) {

@@ -3,9 +3,11 @@
 #include <unistd.h>
 
 #include <algorithm>
+#include <cctype>
 #include <csignal>
 #include <iostream>
-#include <mutex>
+#include <string>
+#include <vector>
 
 #include "hostlibs/VynLogging.h"
 #include "hostlibs/winport.h"
@@ -187,13 +189,21 @@ class DecidedMessageBox final : public vyn::ie::IDexMessageBox {
   bool allow_;
 };
 
-bool parseTypes(const std::string& list, vyn::ie::DexSettings& settings, std::string& error) {
-  settings.removeAllDataTypes();
+// The items of a comma-separated option value; empty items are kept (and then refused).
+std::vector<std::string> commaItems(const std::string& list) {
+  std::vector<std::string> items;
   std::size_t start = 0;
   while (start <= list.size()) {
     const std::size_t comma = std::min(list.find(',', start), list.size());
-    const std::string word = list.substr(start, comma - start);
+    items.push_back(list.substr(start, comma - start));
     start = comma + 1;
+  }
+  return items;
+}
+
+bool parseTypes(const std::string& list, vyn::ie::DexSettings& settings, std::string& error) {
+  settings.removeAllDataTypes();
+  for (const std::string& word : commaItems(list)) {
     vyn::ie::EDexDataType type{};
     if (!vyn::ie::dataTypeFromKeyword(wide(word), type)) {
       error = "--types: unknown data kind \"" + word + "\"";
@@ -207,11 +217,7 @@ bool parseTypes(const std::string& list, vyn::ie::DexSettings& settings, std::st
 // "Name,Northing:12,..." : point field names, each with an optional column width after a colon.
 bool parseFields(const std::string& list, vyn::ie::DexUserAsciiSettingsData& ascii, std::string& error) {
   ascii.fields.clear();
-  std::size_t start = 0;
-  while (start <= list.size()) {
-    const std::size_t comma = std::min(list.find(',', start), list.size());
-    std::string item = list.substr(start, comma - start);
-    start = comma + 1;
+  for (std::string item : commaItems(list)) {
     int width = 0;
     if (const std::size_t colon = item.rfind(':'); colon != std::string::npos) {
       const std::string digits = item.substr(colon + 1);
