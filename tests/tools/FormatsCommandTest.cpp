@@ -2,12 +2,11 @@
 
 #include <gtest/gtest.h>
 
-#include <array>
-#include <cstdio>
-#include <sstream>
+#include <algorithm>
 #include <string>
 #include <vector>
 
+#include "ToolRun.h"
 #include "ieDefinitions/IEFormatsData.h"
 #include "support/TempDir.h"
 
@@ -16,35 +15,11 @@ using vyn::ie::DexFlags;
 
 namespace {
 
-struct ToolRun {
-  int exitCode = -1;
-  std::string out;
-  std::string err;
-};
+using dex_test::linesOf;
+using dex_test::ToolRun;
 
 ToolRun runFormats(const std::string& arguments) {
-  const dex_test::TempDir folder;
-  const std::string errFile = folder.file("stderr.txt");
-  ToolRun run;
-  const std::string command = std::string(DEXCHANGE_TOOL_PATH) + " formats " + arguments + " 2>" + errFile;
-  FILE* pipe = ::popen(command.c_str(), "r");
-  if (pipe == nullptr) return run;
-  std::array<char, 4096> chunk{};
-  std::size_t read = 0;
-  while ((read = std::fread(chunk.data(), 1, chunk.size(), pipe)) > 0)
-    run.out.append(chunk.data(), read);
-  const int status = ::pclose(pipe);
-  run.exitCode = WIFEXITED(status) ? WEXITSTATUS(status) : -1;
-  run.err = dex_test::readFile(errFile);
-  return run;
-}
-
-std::vector<std::string> linesOf(const std::string& text) {
-  std::vector<std::string> lines;
-  std::istringstream stream(text);
-  for (std::string line; std::getline(stream, line);)
-    lines.push_back(line);
-  return lines;
+  return dex_test::runApart("formats " + arguments);
 }
 
 // The indexes of the table's rows (the lines between the heading and the count).
@@ -91,7 +66,7 @@ TEST(FormatsCommand, ListsTheWholeRegistryWithoutAFilter) {
   const std::vector<std::string> lines = linesOf(run.out);
   ASSERT_EQ(156u, lines.size());
   EXPECT_EQ(0u, lines.front().find("  #  Name"));
-  for (const char* column : {"Direction", "Ext", "Data kinds", "Units", "Libraries"})
+  for (const char* column : {"Direction", "Tool", "Ext", "Data kinds", "Units", "Libraries"})
     EXPECT_NE(std::string::npos, lines.front().find(column)) << column;
   EXPECT_EQ("154 formats", lines.back());
   std::vector<int> all(154);
@@ -101,19 +76,39 @@ TEST(FormatsCommand, ListsTheWholeRegistryWithoutAFilter) {
   EXPECT_NE(std::string::npos, run.out.find("MapInfo (*.mif)"));
 }
 
-TEST(FormatsCommand, ShowsDirectionExtensionKindsUnitsAndLibrariesOfARow) {
+TEST(FormatsCommand, ShowsDirectionToolExtensionKindsUnitsAndLibrariesOfARow) {
   const ToolRun run = runFormats("");
   ASSERT_EQ(0, run.exitCode);
-  std::string mif;
-  for (const std::string& line : linesOf(run.out)) {
-    if (line.find("MapInfo (*.mif)") != std::string::npos) mif = line;
+  const std::vector<std::vector<std::string>> rows = {
+      {"11", "MapInfo (*.mif)", "both", "-", "mif", "POINTS,LINES,POINT_LISTS,MULTIPLE", "dist any",
+       "import ImportParsers; export ExportParsers"},
+      {"64", "CSV (Comma delimited) (.csv)", "export", "read, write", "csv", "POINTS,POINT_LISTS", "dist any",
+       "export ExportParsers"},
+  };
+  for (const std::vector<std::string>& row : rows) {
+    const std::string line = linesOf(run.out)[static_cast<std::size_t>(std::stoi(row[0])) + 1];
+    std::vector<std::string> cells;  // the cells are two blanks or more apart
+    for (std::size_t at = line.find_first_not_of(' '); at != std::string::npos;) {
+      const std::size_t end = std::min(line.find("  ", at), line.size());
+      cells.push_back(line.substr(at, end - at));
+      at = line.find_first_not_of(' ', end);
+    }
+    EXPECT_EQ(row, cells);
   }
-  ASSERT_FALSE(mif.empty());
-  EXPECT_NE(std::string::npos, mif.find(" both "));
-  EXPECT_NE(std::string::npos, mif.find(" mif "));
-  EXPECT_NE(std::string::npos, mif.find("POINTS,LINES,POINT_LISTS,MULTIPLE"));
-  EXPECT_NE(std::string::npos, mif.find("dist any"));
-  EXPECT_NE(std::string::npos, mif.find("import ImportParsers; export ExportParsers"));
+}
+
+TEST(FormatsCommand, ListsWhatTheToolReadsAndWritesWhateverTheRegistrysDirection) {
+  const vyn::ie::DexFormatsData& formats = registry();
+  const std::vector<int> shipped = {
+      static_cast<int>(formats.getIndexFormatById(L"{A9A6A37F-F823-4509-9B41-3AC02B45CAA2}")),
+      static_cast<int>(formats.getIndexFormatById(L"{5F39DDC1-F0FD-4F27-938A-96EFF426CD60}"))};
+  for (const char* arguments :
+       {"--tool", "--tool --import", "--tool --export", "--tool --both --type POINTS"})
+    EXPECT_EQ(shipped, listedIndexes(runFormats(arguments))) << arguments;
+  EXPECT_TRUE(listedIndexes(runFormats("--tool --type LINES")).empty());
+  const ToolRun json = runFormats("--guid '{A9A6A37F-F823-4509-9B41-3AC02B45CAA2}' --json");
+  EXPECT_NE(std::string::npos,
+            json.out.find("\"direction\": \"export\",\n  \"toolReads\": true,\n  \"toolWrites\": true"));
 }
 
 TEST(FormatsCommand, ExportFormatsForPointsAreTheRegistrysAnswer) {
