@@ -110,6 +110,16 @@ int numbersIn(const std::vector<std::wstring_view>& values, bool decimalComma) {
   }));
 }
 
+// Whether two column lists read the same (every code column reads the codes with all their parts).
+bool sameKinds(const FieldList& first, const FieldList& second) {
+  return std::equal(first.begin(), first.end(), second.begin(), second.end(),
+                    [](const DexFieldFormat& a, const DexFieldFormat& b) {
+                      const EColumn kindA = columnOf(a.type);
+                      const EColumn kindB = columnOf(b.type);
+                      return kindA == kindB || (isCodes(kindA) && isCodes(kindB));
+                    });
+}
+
 }  // namespace
 
 bool fieldsFromOrder(std::wstring_view order, FieldList& fields) {
@@ -227,7 +237,7 @@ bool findLayout(const std::vector<NumberedLine>& firstLines, PointLayout& layout
     if (layout.headerLine || numbersIn(values, layout.decimalComma()) >= 2) break;
   }
   return columnsBefore == ESource::GIVEN && layout.columnsFrom == ESource::HEADER &&
-         !isArraysEqual(before, layout.fields);
+         !sameKinds(before, layout.fields);
 }
 
 }  // namespace vyn::ie::point_files

