@@ -31,8 +31,10 @@ constexpr int kReadBlockSize = 1 << 20;
 // Lines between two looks at the stop flag and two progress reports.
 constexpr int kStopCheckLines = 1024;
 constexpr int kProgressLines = 16384;
-// The non-blank lines the delimiter and the header line are found from.
+// The non-blank lines the delimiter and the header line are found from, and the most lines read ahead
+// for them (a file of blank lines is not held).
 constexpr std::size_t kSampleLines = 20;
+constexpr std::size_t kMostLinesAhead = 1000;
 // Between the texts a point's notes keep.
 constexpr std::wstring_view kNotesSeparator = L"; ";
 
@@ -52,7 +54,7 @@ class NumberedLines {
   std::vector<NumberedLine> sample(std::size_t count) {
     std::vector<NumberedLine> lines;
     CVynStringT<wchar_t> line;
-    while (lines.size() < count && readFromFile(line)) {
+    while (lines.size() < count && ahead_.size() < kMostLinesAhead && readFromFile(line)) {
       ahead_.emplace_back(number_, std::wstring(line.view()));
       if (!isBlankText(line.view())) lines.push_back(ahead_.back());
     }
