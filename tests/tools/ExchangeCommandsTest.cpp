@@ -20,7 +20,7 @@ using dex_test::runScript;
 using dex_test::runTool;
 using dex_test::TempDir;
 
-const std::string kFields = "--fields 'Name,Northing,Easting,Ht,FullCodes' --delimiter ';'";
+constexpr const char* kFields = "--fields 'Name,Northing,Easting,Ht,FullCodes' --delimiter ';'";
 
 std::string quoted(const std::string& path) {
   return "'" + path + "'";
@@ -47,10 +47,17 @@ TEST(ConvertCommand, ConvertsTheSampleToCustomAsciiAndBackOverwritingOnlyWithFor
   EXPECT_TRUE(contains(there.output, "converted 325 objects")) << there.output;
   EXPECT_EQ(0u,
             dex_test::readFile(dir.file("survey.pts")).rfind("1000;5432100.000;312400.000;85.300;CP\r\n", 0));
-  const auto back =
-      runTool("convert '" + dir.file("survey.pts") + "' '" + dir.file("again.csv") + "' " + kFields);
+  // Back onto an existing file: refused without --force, and the file left alone.
+  const std::string again = dir.write("again.csv", "precious\n");
+  const std::string command = "convert '" + dir.file("survey.pts") + "' '" + again + "' " + kFields;
+  const auto refused = runTool(command);
+  EXPECT_EQ(1, refused.exitCode);
+  EXPECT_EQ("dexchange: convert: " + again + " already exists (use --force to overwrite it)\n",
+            refused.output);
+  EXPECT_EQ("precious\n", dex_test::readFile(again));
+  const auto back = runTool(command + " --force");
   ASSERT_EQ(0, back.exitCode) << back.output;
-  EXPECT_EQ(samplePoints(), dex_test::readFile(dir.file("again.csv")));
+  EXPECT_EQ(samplePoints(), dex_test::readFile(again));
 }
 
 TEST(ConvertCommand, ARealJobInEastingNorthingOrderKeepsEveryLine) {
@@ -146,7 +153,7 @@ TEST(InfoCommand, NamesTheFormatByGuidIndexNameTitlePrefixOrExtension) {
        {std::string("'{5f39ddc1-f0fd-4f27-938a-96eff426cd60}'"), std::to_string(index),
         std::string("'customizable ascii point files'"), std::string("'ASCII Points'"),
         std::string("Customizable"), std::string("pts"), std::string(".PTS")}) {
-    const auto run = runApart("info '" + file + "' --from " + from);
+    const auto run = runApart("info '" + file + "' --from " += from);
     EXPECT_EQ(0, run.exitCode) << from << "\n" << run.err;
     EXPECT_TRUE(contains(run.out, "format:   Customizable ASCII")) << from << "\n" << run.out;
     EXPECT_TRUE(contains(run.out, "design points: 2\n")) << from << "\n" << run.out;

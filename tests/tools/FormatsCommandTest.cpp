@@ -83,7 +83,7 @@ TEST(FormatsCommand, ListsTheWholeRegistryWithAHeadingAndACount) {
        "export ExportParsers"},
   };
   for (const std::vector<std::string>& row : rows) {
-    const std::string line = lines[static_cast<std::size_t>(std::stoi(row[0])) + 1];
+    const std::string& line = lines[static_cast<std::size_t>(std::stoi(row[0])) + 1];
     std::vector<std::string> cells;  // the cells are two blanks or more apart
     for (std::size_t at = line.find_first_not_of(' '); at != std::string::npos;) {
       const std::size_t end = std::min(line.find("  ", at), line.size());

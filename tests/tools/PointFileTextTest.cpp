@@ -241,6 +241,7 @@ TEST(PointFileText, TheDelimiterIsTheOneThatGivesLinesOfNumbers) {
   };
   for (const auto& [texts, delimiter] : cases) {
     std::vector<NumberedLine> lines;
+    lines.reserve(texts.size());
     for (const wchar_t* text : texts)
       lines.emplace_back(static_cast<int>(lines.size()) + 1, text);
     EXPECT_EQ(delimiter, findDelimiter(lines, L'?')) << texts.front();

@@ -23,7 +23,7 @@ bool toolWrites(const DexFormat& format) {
 }
 
 std::string plainName(const DexFormat& format) {
-  const std::string name = utf8(format.getName());
+  std::string name = utf8(format.getName());
   const std::size_t open = name.rfind('(');
   if (open == std::string::npos || name.back() != ')') return name;
   const std::string group = name.substr(open);
