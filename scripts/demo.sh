@@ -16,3 +16,5 @@ fields="Name,Northing,Easting,Ht,FullCodes"
 run convert "$samples/survey.csv" "$work/survey.pts" --fields "$fields" --delimiter ';' --force
 echo "\$ head -4 survey.pts"; head -4 "$work/survey.pts"; echo
 run info "$work/survey.pts" --fields "$fields" --delimiter ';'
+# A real job written by field software: easting before northing, dates and times after the code.
+run info "$samples/../tests/data/pointfiles/geodepy_Site13-134.txt" --order PENZD
