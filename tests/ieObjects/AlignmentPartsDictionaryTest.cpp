@@ -2,7 +2,13 @@
 
 #include <gtest/gtest.h>
 
+#include <memory>
+
+#include "ieObjects/IEData.h"
+#include "ieObjects/IEHorizontalAlignment.h"
 #include "ieObjects/IEPoints.h"
+#include "ieObjects/IEVerticalAlignment.h"
+#include "ieObjects/detail/AlignmentPartsLog.h"
 #include "support/LogCapture.h"
 
 namespace {
@@ -11,9 +17,9 @@ using vyn::ie::DexAlignmentPartsDictionary;
 using vyn::ie::DexDesignPoint;
 using vyn::ie::IDexAlignmentPart;
 
-constexpr const wchar_t* kLogSource = L"ieObjects\\IEAlignmentPartsDictionary";
-constexpr int kNullPartLine = 801;
-constexpr int kUnknownKindLine = 802;
+constexpr const wchar_t* kLogSource = vyn::ie::detail::kAlignmentPartsLogSource;
+constexpr int kNullPartLine = vyn::ie::detail::kPartsNullPartLine;
+constexpr int kUnknownKindLine = vyn::ie::detail::kPartsUnknownKindLine;
 
 // A part of any kind (also one outside the table) that counts its deletions.
 class TestPart : public IDexAlignmentPart {
@@ -127,6 +133,23 @@ TEST(AlignmentPartsDictionary, StartPointsOfHorizontalAndVerticalAlignmentsOnlyC
   EXPECT_TRUE(dictionary.isPointUsedAsStartPoint(L"200"));
   EXPECT_FALSE(dictionary.isPointUsedAsStartPoint(L"300"));
   EXPECT_FALSE(dictionary.isPointUsedAsStartPoint(L""));
+}
+
+TEST(AlignmentPartsDictionary, ContainerKeepsNamesUniqueWithinEachKind) {
+  vyn::ie::DexData data{vyn::ie::DexSettings()};
+  auto* const horizontal = new vyn::ie::DexHorizontalAlignment();
+  horizontal->setName(L"MAIN");
+  auto* const vertical = new vyn::ie::DexVerticalAlignment();
+  vertical->setName(L"MAIN");
+  const auto second = std::make_unique<vyn::ie::DexHorizontalAlignment>();
+  second->setName(L"MAIN");
+  EXPECT_TRUE(data.addIEAlignmentPartToDictionary(horizontal));
+  EXPECT_TRUE(data.addIEAlignmentPartToDictionary(vertical));
+  EXPECT_FALSE(data.addIEAlignmentPartToDictionary(second.get()));  // stays with the caller
+  const DexAlignmentPartsDictionary* const dictionary = data.getIEAlignmentPartsDictionary();
+  EXPECT_EQ(horizontal, dictionary->findAlignmentPart(IDexAlignmentPart::HORIZONTAL_ALIGNMENT, L"MAIN"));
+  EXPECT_EQ(vertical, dictionary->findAlignmentPart(IDexAlignmentPart::VERTICAL_ALIGNMENT, L"MAIN"));
+  EXPECT_EQ(1, dictionary->getNumberOfElements(IDexAlignmentPart::HORIZONTAL_ALIGNMENT));
 }
 
 }  // namespace

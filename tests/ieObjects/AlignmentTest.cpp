@@ -14,6 +14,7 @@ namespace {
 
 using vyn::ie::DexAlignment;
 using vyn::ie::DexHorizontalAlignment;
+using vyn::ie::DexVerticalAlignment;
 using vyn::ie::IDexAlignmentPart;
 namespace detail = vyn::ie::detail;
 
@@ -28,14 +29,39 @@ TEST(DexAlignment, NewAlignmentIsKindNineInStateOneWithoutParts) {
   EXPECT_EQ(nullptr, alignment.getStaEquationSet());
 }
 
-TEST(DexAlignment, FirstPartOfAKindIsThePrimaryOne) {
+TEST(DexAlignment, FirstPartOfAKindIsThePrimaryOneAndEveryPartIsListed) {
   DexHorizontalAlignment first;
   DexHorizontalAlignment second;
+  DexVerticalAlignment vertical;
   DexAlignment alignment;
   alignment.setAlignmentPart(&first);
+  alignment.setAlignmentPart(&vertical);
   alignment.setAlignmentPart(&second);
+  alignment.setAlignmentPart(&first);
   EXPECT_EQ(&first, alignment.getAlignmentPart(IDexAlignmentPart::HORIZONTAL_ALIGNMENT));
-  EXPECT_EQ(nullptr, alignment.getAlignmentPart(IDexAlignmentPart::VERTICAL_ALIGNMENT));
+  EXPECT_EQ(&vertical, alignment.getAlignmentPart(IDexAlignmentPart::VERTICAL_ALIGNMENT));
+  EXPECT_EQ(nullptr, alignment.getAlignmentPart(IDexAlignmentPart::CROSS_SECTION_SET));
+  const IDexAlignmentPart* const listed[] = {&first, &vertical, &second, &first};
+  ASSERT_EQ(4, alignment.getNumberOfAlignmentParts());
+  for (int i = 0; i < 4; ++i)
+    EXPECT_EQ(listed[i], alignment.getAlignmentPartAt(i));
+  EXPECT_EQ(nullptr, alignment.getAlignmentPartAt(4));
+  EXPECT_EQ(nullptr, alignment.getAlignmentPartAt(-1));
+}
+
+TEST(DexAlignment, IncludesThePartsGivenToItByIdentity) {
+  DexHorizontalAlignment given;
+  given.setName(L"H");
+  DexHorizontalAlignment namesake;
+  namesake.setName(L"H");
+  DexAlignment alignment;
+  EXPECT_FALSE(alignment.isAlignPartIncluded(&given, false));
+  alignment.setAlignmentPart(&given);
+  for (const bool deep : {false, true}) {
+    EXPECT_TRUE(alignment.isAlignPartIncluded(&given, deep));
+    EXPECT_FALSE(alignment.isAlignPartIncluded(&namesake, deep));
+    EXPECT_FALSE(alignment.isAlignPartIncluded(nullptr, deep));
+  }
 }
 
 TEST(DexAlignment, NullPartsAndUnknownKindsAreReported) {
@@ -86,19 +112,6 @@ TEST(DexAlignment, CopySharesPartsAndDuplicatesDrawProperties) {
   ASSERT_NE(nullptr, copy.getDrawProperties());
   EXPECT_NE(alignment.getDrawProperties(), copy.getDrawProperties());
   EXPECT_EQ(0x00FF00u, objects_test::colorOf(copy.getDrawProperties()));
-}
-
-TEST(DexHorizontalAlignment, IsAHorizontalPartInStateOne) {
-  DexHorizontalAlignment alignment;
-  EXPECT_EQ(IDexAlignmentPart::HORIZONTAL_ALIGNMENT, alignment.getType());
-  EXPECT_EQ(1, alignment.getStateType());
-  EXPECT_EQ(nullptr, alignment.getStartPoint());
-  alignment.setName(L"H1");
-  alignment.setStaStart(100.0);
-  alignment.setLength(250.0);
-  EXPECT_EQ(L"H1", alignment.getName());
-  EXPECT_EQ(100.0, alignment.getStaStart());
-  EXPECT_EQ(250.0, alignment.getLength());
 }
 
 }  // namespace
