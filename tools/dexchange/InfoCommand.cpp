@@ -4,6 +4,7 @@
 
 #include "Command.h"
 #include "ExchangeRun.h"
+#include "RoadsSummary.h"
 #include "ieObjects/IEData.h"
 #include "ieObjects/IEDataDictionary.h"
 #include "ieObjects/IEDataset.h"
@@ -87,8 +88,9 @@ class InfoCommand final : public Command {
            "                          [--units UNIT]\n"
            "\n"
            "Imports FILE through the plug-in of its format (in a worker thread; Ctrl-C stops) and prints\n"
-           "its datasets, objects by kind, codes, layers and coordinate extent. The options are those of\n"
-           "\"dexchange convert\" for the input side.\n"
+           "its datasets, objects by kind, codes, layers and coordinate extent, then its roads when it has\n"
+           "any: alignments with their parts, the parts by kind and the station-equation sets. The options\n"
+           "are those of \"dexchange convert\" for the input side.\n"
            "\n"
            "Exit codes: 0 shown, 1 the import failed, 2 wrong command line, 130 stopped.\n";
   }
@@ -148,6 +150,7 @@ class InfoCommand final : public Command {
     out << "  north   " << all.north.text() << '\n';
     out << "  east    " << all.east.text() << '\n';
     out << "  height  " << all.height.text() << '\n';
+    printRoads(out, data);
   }
 };
 
