@@ -5,13 +5,14 @@
 #include <cmath>
 #include <limits>
 #include <numbers>
+#include <variant>
 
 #include "hostlibs/detail/SinCosDegrees.h"
 
 namespace {
 
 constexpr double kNaN = std::numeric_limits<double>::quiet_NaN();
-const CCurveNE kNoPoint{kNaN, kNaN};
+constexpr CCurveNE kNoPoint{kNaN, kNaN};
 
 // Gauss-Legendre quadrature with 8 nodes on [-1, 1]: the nodes of the positive half and their weights.
 constexpr std::array<double, 4> kNodes = {0.18343464249564980494, 0.52553240991632898582,
@@ -82,11 +83,41 @@ CCurveNE turnedBack(const CCurveNE& v, double angle) {
 
 // A spiral to the tangent is the parabola from the tangent run backwards: it starts at the parabola's
 // far end, heading back, and turns the other way round. mirror is that parabola (of the opposite
-// signed radius), u the distance from this spiral's start.
-CCurveNE parabolaToTangentPoint(const CubicParabola& mirror, double length, double u) {
-  const CCurveNE far = mirror.pointAt(length);
-  const CCurveNE here = mirror.pointAt(length - u);
-  return turnedBack({far.x - here.x, far.y - here.y}, mirror.turnAt(length));
+// signed radius); distances u run from this spiral's start.
+struct CubicParabolaToTangent {
+  CubicParabola mirror;
+  double length = 0.0;
+
+  CCurveNE pointAt(double u) const {
+    const CCurveNE far = mirror.pointAt(length);
+    const CCurveNE here = mirror.pointAt(length - u);
+    return turnedBack({far.x - here.x, far.y - here.y}, mirror.turnAt(length));
+  }
+  double turnAt(double u) const { return mirror.turnAt(length - u) - mirror.turnAt(length); }
+};
+
+struct Straight {
+  CCurveNE pointAt(double s) const { return {s, 0.0}; }
+  double turnAt(double /*s*/) const { return 0.0; }
+};
+
+// What has no defined shape: a cubic parabola between two arcs, an unknown math type.
+struct Undefined {
+  CCurveNE pointAt(double /*s*/) const { return kNoPoint; }
+  double turnAt(double /*s*/) const { return kNaN; }
+};
+
+using SpiralShape = std::variant<Straight, LinearCurvature, CubicParabola, CubicParabolaToTangent, Undefined>;
+
+// The formula that gives the points and turns of a spiral.
+SpiralShape spiralShape(int mathType, double length, double startRadius, double endRadius) {
+  const double k0 = curvatureOf(startRadius);
+  const double k1 = curvatureOf(endRadius);
+  if (length == 0.0 || (k0 == 0.0 && k1 == 0.0)) return Straight{};
+  if (mathType == CCurveDataSpiral::CLOTHOID) return LinearCurvature{k0, (k1 - k0) / length};
+  if (mathType != CCurveDataSpiral::CUBIC_PARABOLA || (k0 != 0.0 && k1 != 0.0)) return Undefined{};
+  if (k0 == 0.0) return CubicParabola{endRadius * length};
+  return CubicParabolaToTangent{CubicParabola{-startRadius * length}, length};
 }
 
 // The intersection of the start tangent (the local northing axis) with the tangent at end, heading
@@ -155,38 +186,13 @@ double CCurveDataSpiral::getDefiningRadius() const noexcept {
 }
 
 CCurveNE CCurveDataSpiral::getLocalNE(double distance) const noexcept {
-  if (length_ == 0.0 || (!isCurved(startRadius_) && !isCurved(endRadius_))) return {distance, 0.0};
-  switch (mathType_) {
-    case CLOTHOID: {
-      const double k0 = curvatureOf(startRadius_);
-      return LinearCurvature{k0, (curvatureOf(endRadius_) - k0) / length_}.pointAt(distance);
-    }
-    case CUBIC_PARABOLA:
-      if (isTSSC()) return CubicParabola{endRadius_ * length_}.pointAt(distance);
-      if (isCSST()) return parabolaToTangentPoint(CubicParabola{-startRadius_ * length_}, length_, distance);
-      return kNoPoint;
-    default:
-      return kNoPoint;
-  }
+  return std::visit([distance](const auto& shape) { return shape.pointAt(distance); },
+                    spiralShape(mathType_, length_, startRadius_, endRadius_));
 }
 
 double CCurveDataSpiral::getLocalTurn(double distance) const noexcept {
-  if (length_ == 0.0 || (!isCurved(startRadius_) && !isCurved(endRadius_))) return 0.0;
-  switch (mathType_) {
-    case CLOTHOID: {
-      const double k0 = curvatureOf(startRadius_);
-      return LinearCurvature{k0, (curvatureOf(endRadius_) - k0) / length_}.turnAt(distance);
-    }
-    case CUBIC_PARABOLA:
-      if (isTSSC()) return CubicParabola{endRadius_ * length_}.turnAt(distance);
-      if (isCSST()) {
-        const CubicParabola mirror{-startRadius_ * length_};
-        return mirror.turnAt(length_ - distance) - mirror.turnAt(length_);
-      }
-      return kNaN;
-    default:
-      return kNaN;
-  }
+  return std::visit([distance](const auto& shape) { return shape.turnAt(distance); },
+                    spiralShape(mathType_, length_, startRadius_, endRadius_));
 }
 
 bool CCurveDataSpiral::getLocalIp(CCurveNE& ip) const noexcept {
@@ -198,7 +204,8 @@ bool CCurveDataSpiral::getLocalIp(CCurveNE& ip) const noexcept {
 CCurveNE COrgAzFrame::curveNE2worldNE(const CCurveNE& local) const noexcept {
   if (std::isnan(startAzimuth_.getDeg())) return kNoPoint;
   const vyn_math::detail::SinCos turn = vyn_math::detail::sinCosDegrees(startAzimuth_.getDeg());
-  return {start_.x + local.x * turn.cos - local.y * turn.sin, start_.y + local.x * turn.sin + local.y * turn.cos};
+  return {start_.x + local.x * turn.cos - local.y * turn.sin,
+          start_.y + local.x * turn.sin + local.y * turn.cos};
 }
 
 CMathAngle COrgAzFrame::azimuthAfterTurn(double localTurn) const noexcept {

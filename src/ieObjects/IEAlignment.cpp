@@ -74,7 +74,8 @@ bool DexAlignment::isAlignPartIncluded(const IDexAlignmentPart* part, bool deep)
 }
 
 IDexAlignmentPart* DexAlignment::getAlignmentPartAt(int index) const noexcept {
-  return index >= 0 && index < getNumberOfAlignmentParts() ? parts_[static_cast<std::size_t>(index)] : nullptr;
+  return index >= 0 && index < getNumberOfAlignmentParts() ? parts_[static_cast<std::size_t>(index)]
+                                                           : nullptr;
 }
 
 bool DexAlignment::getStnInterval(double& interval) const {

@@ -14,9 +14,9 @@ namespace {
 using namespace detail;
 
 constexpr std::array<const wchar_t*, DexSpiral::kNumberOfSpiralTypes> kSpiralTypeNames = {
-    L"biquadratic", L"biquadraticParabola", L"bloss",        L"clothoid",    L"cosine",       L"cubic",
-    L"cubicParabola", L"japaneseCubic",     L"radioid",      L"revBiquadratic", L"revBloss", L"revCosine",
-    L"revSinusoid", L"sineHalfWave",       L"sinusoid",     L"weinerBogen"};
+    L"biquadratic",   L"biquadraticParabola", L"bloss",    L"clothoid",       L"cosine",   L"cubic",
+    L"cubicParabola", L"japaneseCubic",       L"radioid",  L"revBiquadratic", L"revBloss", L"revCosine",
+    L"revSinusoid",   L"sineHalfWave",        L"sinusoid", L"weinerBogen"};
 
 DexPosition2D positionOf(const CCurveNE& point) {
   return {point.x, point.y};

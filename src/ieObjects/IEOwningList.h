@@ -174,9 +174,10 @@ class DexOwningList {
   // change places.
   template <class Less>
   void sort(Less less) {
-    std::sort(items_.begin(), items_.end(), [&less](const std::unique_ptr<T>& a, const std::unique_ptr<T>& b) {
-      return less(static_cast<const T&>(*a), static_cast<const T&>(*b));
-    });
+    std::sort(items_.begin(), items_.end(),
+              [&less](const std::unique_ptr<T>& a, const std::unique_ptr<T>& b) {
+                return less(static_cast<const T&>(*a), static_cast<const T&>(*b));
+              });
   }
 
   // Iteration over the item pointers, in list order.

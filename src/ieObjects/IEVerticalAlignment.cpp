@@ -64,8 +64,9 @@ void DexVerticalAlignment::addLongSection(DexLongSection* section) {
 }
 
 const DexLongSection* DexVerticalAlignment::getLongSectionAt(int index) const noexcept {
-  return index >= 0 && index < getNumberOfLongSections() ? longSections_[static_cast<std::size_t>(index)].get()
-                                                         : nullptr;
+  return index >= 0 && index < getNumberOfLongSections()
+             ? longSections_[static_cast<std::size_t>(index)].get()
+             : nullptr;
 }
 
 DexLongSection* DexVerticalAlignment::getLongSectionAt(int index) noexcept {

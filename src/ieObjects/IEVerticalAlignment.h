@@ -133,7 +133,9 @@ class DEX_API DexVerticalAlignment : public IDexAlignmentPart, public IDexAlignm
   bool addVerticalElement(DexVerticalElement* element) { return verticalElements_.add(element); }
   int getNumberOfVerticalElements() const noexcept { return verticalElements_.count(); }
   // The element at index, or null for an index outside the list.
-  const DexVerticalElement* getVerticalElementAt(int index) const noexcept { return verticalElements_.at(index); }
+  const DexVerticalElement* getVerticalElementAt(int index) const noexcept {
+    return verticalElements_.at(index);
+  }
   DexVerticalElement* getVerticalElementAt(int index) noexcept { return verticalElements_.at(index); }
 
   // ---- Long sections --------------------------------------------------------------------------

@@ -22,7 +22,8 @@ using Spiral = CCurveDataSpiral;
 // azimuthDeg: written out from the definition, without the library's rotation.
 CCurveNE placed(const CCurveNE& start, double azimuthDeg, double along, double right) {
   const double a = azimuthDeg * kPi / 180.0;
-  return {start.x + along * std::cos(a) - right * std::sin(a), start.y + along * std::sin(a) + right * std::cos(a)};
+  return {start.x + along * std::cos(a) - right * std::sin(a),
+          start.y + along * std::sin(a) + right * std::cos(a)};
 }
 
 void expectNear(const CCurveNE& expected, const CCurveNE& actual, double tolerance = kTolerance) {
@@ -110,7 +111,8 @@ TEST(CurveArc, ChainOfArcsAroundAFullCircleReturnsToItsStart) {
     for (const double share : shares) {
       const CCurveArc arc(CCurveDataArc(share * circumference, radius), here.x, here.y, azimuth);
       const CCurveNE centre = placed(here, azimuth.getDeg(), 0.0, radius);
-      EXPECT_NEAR(std::abs(radius), std::hypot(arc.getFinalNorthing() - centre.x, arc.getFinalEasting() - centre.y),
+      EXPECT_NEAR(std::abs(radius),
+                  std::hypot(arc.getFinalNorthing() - centre.x, arc.getFinalEasting() - centre.y),
                   kTolerance);
       here = arc.getFinalNE();
       azimuth = arc.getFinalAzimut();
@@ -126,7 +128,8 @@ TEST(CurveArc, IntersectionPointLiesAtTheTangentLengthOnBothTangents) {
   for (const double radius : {250.0, -250.0}) {
     for (const double deltaDeg : {5.0, 60.0, 90.0, 170.0}) {
       const double delta = deltaDeg * kPi / 180.0;
-      const CCurveArc arc(CCurveDataArc(std::abs(radius) * delta, radius), start.x, start.y, CMathAngle(startAzimuth));
+      const CCurveArc arc(CCurveDataArc(std::abs(radius) * delta, radius), start.x, start.y,
+                          CMathAngle(startAzimuth));
       const double tangent = std::abs(radius) * std::tan(delta / 2.0);
       CCurveNE ip;
       ASSERT_TRUE(arc.getCurveIp(ip));
@@ -145,7 +148,8 @@ TEST(CurveArc, CentreLiesOnTheSideOfTheTurn) {
     const CCurveArc arc(CCurveDataArc(100.0, radius), start.x, start.y, CMathAngle(0.0));
     const CCurveNE centre = arc.curveNE2worldNE(arc.getCenterNE());
     expectNear({0.0, radius}, centre);  // east of a northward start for a clockwise turn
-    EXPECT_NEAR(80.0, std::hypot(arc.getFinalNorthing() - centre.x, arc.getFinalEasting() - centre.y), kTolerance);
+    EXPECT_NEAR(80.0, std::hypot(arc.getFinalNorthing() - centre.x, arc.getFinalEasting() - centre.y),
+                kTolerance);
     EXPECT_EQ(radius > 0.0, arc.getFinalEasting() > 0.0);
   }
 }
@@ -155,14 +159,17 @@ TEST(CurveArc, ArcsWithoutATurnOfLessThanHalfACircleHaveNoIntersectionPoint) {
     double length;
     double radius;
   };
-  const Case cases[] = {{1.1 * kPi * 100.0, 100.0}, {1.5 * kPi * 100.0, -100.0}, {0.0, 100.0},
+  const Case cases[] = {{1.1 * kPi * 100.0, 100.0},
+                        {1.5 * kPi * 100.0, -100.0},
+                        {0.0, 100.0},
                         {50.0, std::numeric_limits<double>::infinity()}};
   for (const Case& c : cases) {
     const CCurveArc arc(CCurveDataArc(c.length, c.radius), 0.0, 0.0, CMathAngle(0.0));
     CCurveNE ip;
     EXPECT_FALSE(arc.getCurveIp(ip)) << c.length << " " << c.radius;
   }
-  const CCurveArc straight(CCurveDataArc(50.0, std::numeric_limits<double>::infinity()), 0.0, 0.0, CMathAngle(0.0));
+  const CCurveArc straight(CCurveDataArc(50.0, std::numeric_limits<double>::infinity()), 0.0, 0.0,
+                           CMathAngle(0.0));
   expectNear({50.0, 0.0}, straight.getFinalNE());
   const CCurveArc degenerate(CCurveDataArc(50.0, 0.0), 0.0, 0.0, CMathAngle(0.0));
   EXPECT_TRUE(std::isnan(degenerate.getFinalNorthing()));
@@ -177,16 +184,18 @@ struct ClothoidCase {
 };
 
 const ClothoidCase kClothoids[] = {
-    {100.0, 500.0, 0.0},  {100.0, -500.0, 123.0}, {1000.0, 500.0, 45.0}, {1000.0, -2000.0, 310.0},
-    {60.0, 30.0, 200.0},  {1000.0, 300.0, 90.0},  {250.0, -100.0, 0.0},
+    {100.0, 500.0, 0.0}, {100.0, -500.0, 123.0}, {1000.0, 500.0, 45.0}, {1000.0, -2000.0, 310.0},
+    {60.0, 30.0, 200.0}, {1000.0, 300.0, 90.0},  {250.0, -100.0, 0.0},
 };
 
 TEST(CurveSpiral, ClothoidEndPointsMatchTheSeriesAndSimpsonsRule) {
   const CCurveNE start{10000.0, 20000.0};
   for (const ClothoidCase& c : kClothoids) {
-    const CCurveSpiral spiral(Spiral(Spiral::CLOTHOID, c.length, 0.0, c.radius), start.x, start.y, CMathAngle(c.azimuth));
+    const CCurveSpiral spiral(Spiral(Spiral::CLOTHOID, c.length, 0.0, c.radius), start.x, start.y,
+                              CMathAngle(c.azimuth));
     const CCurveNE series = clothoidBySeries(c.length, c.radius);
-    const CCurveNE simpson = bySimpson(c.length, [&c](double s) { return s * s / (2.0 * c.radius * c.length); });
+    const CCurveNE simpson =
+        bySimpson(c.length, [&c](double s) { return s * s / (2.0 * c.radius * c.length); });
     expectNear(placed(start, c.azimuth, series.x, series.y), spiral.getFinalNE());
     expectNear(placed(start, c.azimuth, simpson.x, simpson.y), spiral.getFinalNE());
     const double turnDeg = c.length / (2.0 * c.radius) * 180.0 / kPi;
@@ -200,9 +209,11 @@ TEST(CurveSpiral, ClothoidBetweenTwoArcsMatchesSimpsonsRule) {
     double startRadius;
     double endRadius;
   };
-  const Case cases[] = {{150.0, 1000.0, 400.0}, {150.0, -400.0, -1000.0}, {300.0, 600.0, -600.0}, {80.0, 200.0, 0.0}};
+  const Case cases[] = {
+      {150.0, 1000.0, 400.0}, {150.0, -400.0, -1000.0}, {300.0, 600.0, -600.0}, {80.0, 200.0, 0.0}};
   for (const Case& c : cases) {
-    const CCurveSpiral spiral(Spiral(Spiral::CLOTHOID, c.length, c.startRadius, c.endRadius), 0.0, 0.0, CMathAngle(0.0));
+    const CCurveSpiral spiral(Spiral(Spiral::CLOTHOID, c.length, c.startRadius, c.endRadius), 0.0, 0.0,
+                              CMathAngle(0.0));
     const double k0 = 1.0 / c.startRadius;
     const double k1 = c.endRadius == 0.0 ? 0.0 : 1.0 / c.endRadius;
     const CCurveNE simpson =
@@ -227,7 +238,8 @@ TEST(CurveSpiral, SpiralToTheTangentRetracesTheSpiralFromItBackwards) {
       const CCurveSpiral out(Spiral(type, 120.0, 0.0, radius), a.x, a.y, CMathAngle(75.0));
       ASSERT_TRUE(out.isTSSC());
       const CMathAngle back(out.getFinalAzimut().getDeg() + 180.0);
-      const CCurveSpiral in(Spiral(type, 120.0, -radius, 0.0), out.getFinalNorthing(), out.getFinalEasting(), back);
+      const CCurveSpiral in(Spiral(type, 120.0, -radius, 0.0), out.getFinalNorthing(), out.getFinalEasting(),
+                            back);
       ASSERT_TRUE(in.isCSST());
       expectNear(a, in.getFinalNE());
       EXPECT_NEAR(0.0, azimuthGap(in.getFinalAzimut().getDeg(), 255.0), 1e-10);
@@ -242,7 +254,8 @@ TEST(CurveSpiral, SpiralToTheTangentRetracesTheSpiralFromItBackwards) {
 
 TEST(CurveSpiral, SpiralIntersectionPointLiesOnBothTangents) {
   for (const ClothoidCase& c : kClothoids) {
-    const CCurveSpiral spiral(Spiral(Spiral::CLOTHOID, c.length, 0.0, c.radius), 0.0, 0.0, CMathAngle(c.azimuth));
+    const CCurveSpiral spiral(Spiral(Spiral::CLOTHOID, c.length, 0.0, c.radius), 0.0, 0.0,
+                              CMathAngle(c.azimuth));
     CCurveNE ip;
     ASSERT_TRUE(spiral.getCurveIp(ip));
     const CCurveNE end = spiral.getFinalNE();

@@ -18,7 +18,7 @@ using vyn::ie::DexVerticalAlignment;
 using vyn::ie::IDexAlignmentPart;
 namespace detail = vyn::ie::detail;
 
-const std::wstring kSource = detail::kAlignmentLogSource;
+constexpr const wchar_t* kSource = detail::kAlignmentLogSource;
 
 TEST(DexAlignment, NewAlignmentIsKindNineInStateOneWithoutParts) {
   DexAlignment alignment;

@@ -23,7 +23,7 @@ using vyn::ie::DexSpiral;
 using vyn::ie::IDexAlignmentObjInterface;
 namespace detail = vyn::ie::detail;
 
-const std::wstring kSource = detail::kAlignmentPartsLogSource;
+constexpr const wchar_t* kSource = detail::kAlignmentPartsLogSource;
 constexpr double kPi = std::numbers::pi;
 constexpr double kTolerance = 1e-9;
 
@@ -107,9 +107,11 @@ TEST(HorizontalElements, PositionKindsOutsideTheRangeLogAndReadPositionZero) {
       {[&](int k, double n, double e) { line.setPosition(k, n, e); },
        [&](int k) -> const DexPosition2D& { return line.getPosition(k); }, 2, detail::kLinePositionKindLine},
       {[&](int k, double n, double e) { curve.setPosition(k, n, e); },
-       [&](int k) -> const DexPosition2D& { return curve.getPosition(k); }, 4, detail::kCurvePositionKindLine},
+       [&](int k) -> const DexPosition2D& { return curve.getPosition(k); }, 4,
+       detail::kCurvePositionKindLine},
       {[&](int k, double n, double e) { spiral.setPosition(k, n, e); },
-       [&](int k) -> const DexPosition2D& { return spiral.getPosition(k); }, 3, detail::kSpiralPositionKindLine},
+       [&](int k) -> const DexPosition2D& { return spiral.getPosition(k); }, 3,
+       detail::kSpiralPositionKindLine},
   };
   for (const auto& element : elements) {
     element.set(0, 10.0, 20.0);
@@ -126,10 +128,10 @@ TEST(HorizontalElements, PositionKindsOutsideTheRangeLogAndReadPositionZero) {
 }
 
 TEST(DexSpiral, NamesItsSixteenTypesAndFallsBackToClothoid) {
-  const wchar_t* const names[] = {L"biquadratic",  L"biquadraticParabola", L"bloss",       L"clothoid",
-                                  L"cosine",       L"cubic",               L"cubicParabola", L"japaneseCubic",
-                                  L"radioid",      L"revBiquadratic",      L"revBloss",    L"revCosine",
-                                  L"revSinusoid",  L"sineHalfWave",        L"sinusoid",    L"weinerBogen"};
+  const wchar_t* const names[] = {
+      L"biquadratic",   L"biquadraticParabola", L"bloss",    L"clothoid",       L"cosine",   L"cubic",
+      L"cubicParabola", L"japaneseCubic",       L"radioid",  L"revBiquadratic", L"revBloss", L"revCosine",
+      L"revSinusoid",   L"sineHalfWave",        L"sinusoid", L"weinerBogen"};
   DexSpiral spiral;
   EXPECT_EQ(L"clothoid", spiral.getSpiralTypeAsString());
   for (int type = 0; type < 16; ++type) {
@@ -237,8 +239,8 @@ TEST(DexHorizontalAlignment, CopyHasItsOwnElementsOfTheSameKinds) {
 // ---- Factories ----------------------------------------------------------------------------------
 
 TEST(DexLine2D, FactoryTakesEndPointsAzimuthLengthAndCallerValues) {
-  const std::unique_ptr<DexLine2D> line(
-      DexLine2D::createSegment(CCurveSegment(CCurveDataSegment(50.0), 1000.0, 2000.0, CMathAngle(90.0)), 7.0, 8.0));
+  const std::unique_ptr<DexLine2D> line(DexLine2D::createSegment(
+      CCurveSegment(CCurveDataSegment(50.0), 1000.0, 2000.0, CMathAngle(90.0)), 7.0, 8.0));
   ASSERT_NE(nullptr, line);
   expectAt(1000.0, 2000.0, line->getStartPosition());
   expectAt(1000.0, 2050.0, line->getPosition(DexLine2D::END_POINT));
@@ -302,7 +304,8 @@ TEST(DexSpiral, FactoryOnSpiralsTurningRightAndLeftIntoAndOutOfCurves) {
     const CCurveSpiral spiral(c.data, 500.0, 600.0, CMathAngle(30.0));
     const std::unique_ptr<DexSpiral> element(DexSpiral::createSegment(spiral, 3.0, 4.0));
     ASSERT_NE(nullptr, element);
-    const int expectedType = c.data.getSpiralMathType() == Data::CLOTHOID ? DexSpiral::CLOTHOID : DexSpiral::CUBIC_PARABOLA;
+    const int expectedType =
+        c.data.getSpiralMathType() == Data::CLOTHOID ? DexSpiral::CLOTHOID : DexSpiral::CUBIC_PARABOLA;
     EXPECT_EQ(expectedType, element->getSpiralType());
     EXPECT_EQ(c.clockwise, element->isTurnClockwised());
     EXPECT_EQ(c.startRadius, element->getData(DexSpiral::START_RADIUS));
@@ -326,7 +329,8 @@ TEST(DexSpiral, FactoryOnSpiralsTurningRightAndLeftIntoAndOutOfCurves) {
 TEST(DexSpiral, FactoryKeepsTheClothoidForAnUnknownMathTypeAndLogs) {
   const dex_test::LogCapture log;
   const CCurveDataSpiral data(static_cast<CCurveDataSpiral::ESpiralMathType>(5), 10.0, 0.0, 50.0);
-  const std::unique_ptr<DexSpiral> spiral(DexSpiral::createSegment(CCurveSpiral(data, 0.0, 0.0, CMathAngle(0.0)), 0, 0));
+  const std::unique_ptr<DexSpiral> spiral(
+      DexSpiral::createSegment(CCurveSpiral(data, 0.0, 0.0, CMathAngle(0.0)), 0, 0));
   ASSERT_NE(nullptr, spiral);
   EXPECT_EQ(DexSpiral::CLOTHOID, spiral->getSpiralType());
   EXPECT_EQ(1, log.count(kSource, detail::kUnknownSpiralMathTypeLine));

@@ -78,8 +78,10 @@ TEST(StaEquation, EqualityComparesValuesAndNamesButNotMarks) {
     bool equal;
   };
   const Case cases[] = {
-      {{100.0, std::nullopt, 1000.0, L"A"}, true}, {{100.0, 0.0, 1000.0, L"A"}, true},  // back 0.0 unset vs set
-      {{100.0, std::nullopt, 1000.0, L"a"}, false}, {{100.5, std::nullopt, 1000.0, L"A"}, false},
+      {{100.0, std::nullopt, 1000.0, L"A"}, true},
+      {{100.0, 0.0, 1000.0, L"A"}, true},  // back 0.0 unset vs set
+      {{100.0, std::nullopt, 1000.0, L"a"}, false},
+      {{100.5, std::nullopt, 1000.0, L"A"}, false},
       {{100.0, 1.0, 1000.0, L"A"}, false},
   };
   for (const Case& c : cases)
@@ -123,7 +125,8 @@ TEST_P(StaEquationSetValidate, SortsCompletesAndChecksInPlace) {
   const std::unique_ptr<DexStaEquationSet> set(newSet(c.equations));
   EXPECT_EQ(c.valid, set->validate());
   for (std::size_t i = 0; i < c.backs.size(); ++i)
-    EXPECT_EQ(c.backs[i], set->getEquationAt(static_cast<int>(i))->getData(DexStaEquation::STATION_BACK)) << i;
+    EXPECT_EQ(c.backs[i], set->getEquationAt(static_cast<int>(i))->getData(DexStaEquation::STATION_BACK))
+        << i;
   for (std::size_t i = 0; i < c.names.size(); ++i)
     EXPECT_EQ(c.names[i], set->getEquationAt(static_cast<int>(i))->getName().view()) << i;
 }
@@ -133,7 +136,8 @@ const double k1100 = 1100.0;
 INSTANTIATE_TEST_SUITE_P(
     Cases, StaEquationSetValidate,
     testing::Values(
-        ValidateCase{"sorted by chainage", {{200, {}, 2000}, {100, {}, 1000}}, true, {100, 1100}, {L"1", L"2"}},
+        ValidateCase{
+            "sorted by chainage", {{200, {}, 2000}, {100, {}, 1000}}, true, {100, 1100}, {L"1", L"2"}},
         ValidateCase{"backs completed", {{0, {}, 1000}, {100, {}, 1500}}, true, {0, 1100}, {}},
         ValidateCase{"back given exactly", {{0, {}, 1000}, {100, k1100, 1500}}, true, {0, 1100}, {}},
         ValidateCase{"back 1e-10 off", {{0, {}, 1000}, {100, k1100 + 1e-10, 1500}}, false, {0}, {L"", L""}},
@@ -141,9 +145,15 @@ INSTANTIATE_TEST_SUITE_P(
         ValidateCase{"back not above the ahead before", {{0, {}, 5}, {1e-13, 5.0, 9}}, false, {}, {}},
         ValidateCase{"NaN back", {{0, {}, 5}, {10, kNaN, 9}}, false, {}, {}},
         ValidateCase{"NaN chainage", {{kNaN, {}, 5}, {10, {}, 9}}, false, {}, {}},
-        ValidateCase{"names around a given one", {{0, {}, 0}, {10, {}, 10, L"2"}, {20, {}, 20}}, true, {},
+        ValidateCase{"names around a given one",
+                     {{0, {}, 0}, {10, {}, 10, L"2"}, {20, {}, 20}},
+                     true,
+                     {},
                      {L"1", L"2", L"3"}},
-        ValidateCase{"counter shared across the pass", {{0, {}, 0}, {10, {}, 10}, {20, {}, 20, L"1"}}, true, {},
+        ValidateCase{"counter shared across the pass",
+                     {{0, {}, 0}, {10, {}, 10}, {20, {}, 20, L"1"}},
+                     true,
+                     {},
                      {L"2", L"3", L"1"}},
         ValidateCase{"repeated name", {{0, {}, 0, L"A"}, {10, {}, 10, L"A"}}, false, {0, 10}, {L"A", L"A"}},
         ValidateCase{"empty set", {}, false, {}, {}}),

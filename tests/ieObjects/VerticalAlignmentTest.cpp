@@ -20,20 +20,13 @@ DexLongSection* sectionAt(double station) {
   return section;
 }
 
-// Elements and sections that count their deletions.
-class CountedElement : public DexVerticalElement {
+// An element or section that counts its deletions.
+template <class Base>
+class Counted : public Base {
  public:
-  explicit CountedElement(int& deletions) : DexVerticalElement(PARABOLA), deletions_(deletions) {}
-  ~CountedElement() override { ++deletions_; }
-
- private:
-  int& deletions_;
-};
-
-class CountedSection : public DexLongSection {
- public:
-  explicit CountedSection(int& deletions) : DexLongSection(LEVEL_POINT), deletions_(deletions) {}
-  ~CountedSection() override { ++deletions_; }
+  template <class Type>
+  Counted(int& deletions, Type type) : Base(type), deletions_(deletions) {}
+  ~Counted() override { ++deletions_; }
 
  private:
   int& deletions_;
@@ -96,8 +89,8 @@ TEST(DexVerticalAlignment, DeletesItsSectionsAndElementsWithItself) {
   int deletions = 0;
   {
     DexVerticalAlignment alignment;
-    alignment.addVerticalElement(new CountedElement(deletions));
-    alignment.addLongSection(new CountedSection(deletions));
+    alignment.addVerticalElement(new Counted<DexVerticalElement>(deletions, DexVerticalElement::PARABOLA));
+    alignment.addLongSection(new Counted<DexLongSection>(deletions, DexLongSection::LEVEL_POINT));
     alignment.addLongSection(nullptr);
   }
   EXPECT_EQ(2, deletions);

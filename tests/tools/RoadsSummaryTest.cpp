@@ -56,16 +56,17 @@ void fillRoad(DexData& data) {
 TEST(RoadsSummary, ListsAlignmentsTheirPartsAndStationEquations) {
   DexData data{DexSettings()};
   fillRoad(data);
-  EXPECT_EQ("alignments: 1\n"
-            "  \"ROAD 1\": stations 10.000 .. 460.000, station equations \"SE\"\n"
-            "    horizontal \"H1\": stations 0.000 .. 450.000, 4 elements (1 line, 1 curve, 2 spirals, 0 "
-            "intersection points), station equations \"SE\"\n"
-            "    vertical \"V1\": stations 0.000 .. 0.000, 1 vertical element, 0 long sections\n"
-            "alignment parts: 1 horizontal, 1 vertical, 0 cross-section sets, 0 road-string sets\n"
-            "station-equation sets: 1\n"
-            "  \"SE\": 1 equation\n"
-            "    \"1\": chainage 100.000, back 100.000, ahead 1000.000\n",
-            summaryOf(data));
+  EXPECT_EQ(
+      "alignments: 1\n"
+      "  \"ROAD 1\": stations 10.000 .. 460.000, station equations \"SE\"\n"
+      "    horizontal \"H1\": stations 0.000 .. 450.000, 4 elements (1 line, 1 curve, 2 spirals, 0 "
+      "intersection points), station equations \"SE\"\n"
+      "    vertical \"V1\": stations 0.000 .. 0.000, 1 vertical element, 0 long sections\n"
+      "alignment parts: 1 horizontal, 1 vertical, 0 cross-section sets, 0 road-string sets\n"
+      "station-equation sets: 1\n"
+      "  \"SE\": 1 equation\n"
+      "    \"1\": chainage 100.000, back 100.000, ahead 1000.000\n",
+      summaryOf(data));
 }
 
 TEST(RoadsSummary, SaysNothingOfAContainerWithoutRoads) {

@@ -75,15 +75,17 @@ std::string equationSetOf(const vyn::ie::IDexAlignmentStaEq& owner) {
 }
 
 void printAlignment(std::ostream& out, const DexAlignment& alignment) {
-  out << "  " << quoted(alignment.getName()) << ": " << stations(alignment.getStaStart(), alignment.getLength())
-      << equationSetOf(alignment) << '\n';
+  out << "  " << quoted(alignment.getName()) << ": "
+      << stations(alignment.getStaStart(), alignment.getLength()) << equationSetOf(alignment) << '\n';
   for (int i = 0; i < alignment.getNumberOfAlignmentParts(); ++i) {
     const IDexAlignmentPart& part = *alignment.getAlignmentPartAt(i);
     const int kind = part.getType();
-    const char* const kindName = kind >= 0 && kind < kPartKinds ? kPartNames[static_cast<std::size_t>(kind)] : "part";
+    const char* const kindName =
+        kind >= 0 && kind < kPartKinds ? kPartNames[static_cast<std::size_t>(kind)] : "part";
     out << "    " << kindName << ' ' << quoted(part.getName()) << ": "
         << stations(part.getStaStart(), part.getLength()) << contentOf(part);
-    if (const auto* withSet = dynamic_cast<const vyn::ie::IDexAlignmentStaEq*>(&part)) out << equationSetOf(*withSet);
+    if (const auto* withSet = dynamic_cast<const vyn::ie::IDexAlignmentStaEq*>(&part))
+      out << equationSetOf(*withSet);
     out << '\n';
   }
 }
