@@ -20,46 +20,28 @@ namespace detail = vyn::ie::detail;
 
 constexpr const wchar_t* kSource = detail::kAlignmentLogSource;
 
-TEST(DexAlignment, NewAlignmentIsKindNineInStateOneWithoutParts) {
-  DexAlignment alignment;
-  EXPECT_EQ(9, alignment.getType());
-  EXPECT_EQ(1, alignment.getStateType());
-  for (int type = 0; type < IDexAlignmentPart::kNumberOfPartTypes; ++type)
-    EXPECT_EQ(nullptr, alignment.getAlignmentPart(type));
-  EXPECT_EQ(nullptr, alignment.getStaEquationSet());
-}
-
-TEST(DexAlignment, FirstPartOfAKindIsThePrimaryOneAndEveryPartIsListed) {
+TEST(DexAlignment, FirstPartOfAKindIsThePrimaryOneAndEveryPartIsIncluded) {
   DexHorizontalAlignment first;
   DexHorizontalAlignment second;
+  second.setName(L"H");
+  DexHorizontalAlignment namesake;
+  namesake.setName(L"H");
   DexVerticalAlignment vertical;
   DexAlignment alignment;
-  alignment.setAlignmentPart(&first);
-  alignment.setAlignmentPart(&vertical);
-  alignment.setAlignmentPart(&second);
-  alignment.setAlignmentPart(&first);
+  EXPECT_FALSE(alignment.isAlignPartIncluded(&first, false));
+  IDexAlignmentPart* const listed[] = {&first, &vertical, &second, &first};
+  for (IDexAlignmentPart* part : listed)
+    alignment.setAlignmentPart(part);
   EXPECT_EQ(&first, alignment.getAlignmentPart(IDexAlignmentPart::HORIZONTAL_ALIGNMENT));
   EXPECT_EQ(&vertical, alignment.getAlignmentPart(IDexAlignmentPart::VERTICAL_ALIGNMENT));
   EXPECT_EQ(nullptr, alignment.getAlignmentPart(IDexAlignmentPart::CROSS_SECTION_SET));
-  const IDexAlignmentPart* const listed[] = {&first, &vertical, &second, &first};
   ASSERT_EQ(4, alignment.getNumberOfAlignmentParts());
   for (int i = 0; i < 4; ++i)
     EXPECT_EQ(listed[i], alignment.getAlignmentPartAt(i));
   EXPECT_EQ(nullptr, alignment.getAlignmentPartAt(4));
-  EXPECT_EQ(nullptr, alignment.getAlignmentPartAt(-1));
-}
-
-TEST(DexAlignment, IncludesThePartsGivenToItByIdentity) {
-  DexHorizontalAlignment given;
-  given.setName(L"H");
-  DexHorizontalAlignment namesake;
-  namesake.setName(L"H");
-  DexAlignment alignment;
-  EXPECT_FALSE(alignment.isAlignPartIncluded(&given, false));
-  alignment.setAlignmentPart(&given);
   for (const bool deep : {false, true}) {
-    EXPECT_TRUE(alignment.isAlignPartIncluded(&given, deep));
-    EXPECT_FALSE(alignment.isAlignPartIncluded(&namesake, deep));
+    EXPECT_TRUE(alignment.isAlignPartIncluded(&second, deep));
+    EXPECT_FALSE(alignment.isAlignPartIncluded(&namesake, deep));  // by identity, not by name
     EXPECT_FALSE(alignment.isAlignPartIncluded(nullptr, deep));
   }
 }
