@@ -27,12 +27,6 @@ constexpr std::array<const char*, kPartKinds> kPartPlurals = {"horizontal", "ver
                                                               "road-string sets"};
 constexpr std::array<const char*, 4> kElementNames = {"line", "curve", "spiral", "intersection point"};
 
-std::string fixed3(double value) {
-  char text[64];
-  const auto end = std::to_chars(text, text + sizeof text, value, std::chars_format::fixed, 3).ptr;
-  return std::string(text, end);
-}
-
 // "1 curve", "2 curves".
 std::string counted(int count, const std::string& noun) {
   return std::to_string(count) + " " + noun + (count == 1 ? "" : "s");
@@ -121,6 +115,12 @@ void printEquationSet(std::ostream& out, const DexStaEquationSet& set) {
 }
 
 }  // namespace
+
+std::string fixed3(double value) {
+  char text[64];
+  const auto end = std::to_chars(text, text + sizeof text, value, std::chars_format::fixed, 3).ptr;
+  return std::string(text, end);
+}
 
 void printRoads(std::ostream& out, const vyn::ie::DexData& data) {
   if (const int count = numberOfAlignments(data); count > 0) {

@@ -1,10 +1,14 @@
 #pragma once
 
 #include <ostream>
+#include <string>
 
 #include "ieObjects/IEData.h"
 
 namespace dexchange_tool {
+
+// value with three decimals ("12.500"), as the tool prints coordinates and stations.
+std::string fixed3(double value);
 
 // Prints what a container holds of roads: the alignments of its datasets (name, station range, parts
 // with their elements counted by kind, station-equation set), the parts of its parts dictionary by
