@@ -488,17 +488,18 @@ TEST(DataDictionaries, AlignmentPartOfAnUnknownKindIsDeclinedWithTheDictionarysR
   EXPECT_EQ(1, log.count(L"ieObjects\\IEAlignmentPartsDictionary", 802));
 }
 
+// A valid station-equation set of one equation; distinct aheads keep sets unequal.
+DexStaEquationSet* newSet(const wchar_t* name, double ahead) {
+  auto* const set = new DexStaEquationSet(name);
+  vyn::ie::DexStaEquation equation;
+  equation.setData(vyn::ie::DexStaEquation::RUNNING_CHAINAGE, 0.0);
+  equation.setData(vyn::ie::DexStaEquation::STATION_AHEAD, ahead);
+  set->addEquation(&equation);
+  return set;
+}
+
 TEST(DataDictionaries, StationEquationSetIsDeclinedForAnExistingName) {
   DexData data(DexSettings{});
-  // A valid set (one equation); distinct aheads keep the sets unequal.
-  const auto newSet = [](const wchar_t* name, double ahead) {
-    auto* const set = new DexStaEquationSet(name);
-    vyn::ie::DexStaEquation equation;
-    equation.setData(vyn::ie::DexStaEquation::RUNNING_CHAINAGE, 0.0);
-    equation.setData(vyn::ie::DexStaEquation::STATION_AHEAD, ahead);
-    set->addEquation(&equation);
-    return set;
-  };
   auto* const main = newSet(L"main", 1.0);
   EXPECT_TRUE(data.addIEStaEquationSetToDictionary(main));
 
@@ -929,7 +930,7 @@ TEST(DataOwnership, ReleasesEveryKindOfMember) {
   data.getIEDrawDictionary()->addLayer(new DexLayer());
   data.addIERoadTemplateToDictionary(new DexRoadTemplate(L"crown"));
   data.addIEAlignmentPartToDictionary(new Part(IDexAlignmentPart::CROSS_SECTION_SET, L"X"));
-  data.addIEStaEquationSetToDictionary(new DexStaEquationSet(L"main"));
+  EXPECT_TRUE(data.addIEStaEquationSetToDictionary(newSet(L"main", 1.0)));
   data.attachIELocalization(new DexLocalization());
   data.addDLRun(new DexDLRun(L"R1", L""));
   data.addGpsAntenna(new DexGpsAntennaSettings());
