@@ -109,6 +109,16 @@ struct Undefined {
 
 using SpiralShape = std::variant<Straight, LinearCurvature, CubicParabola, CubicParabolaToTangent, Undefined>;
 
+// visitor(shape) for the shape held; without std::visit, which could throw.
+template <class Visitor>
+auto onShape(const SpiralShape& shape, Visitor visitor) noexcept {
+  if (const auto* clothoid = std::get_if<LinearCurvature>(&shape)) return visitor(*clothoid);
+  if (const auto* fromTangent = std::get_if<CubicParabola>(&shape)) return visitor(*fromTangent);
+  if (const auto* toTangent = std::get_if<CubicParabolaToTangent>(&shape)) return visitor(*toTangent);
+  if (const auto* straight = std::get_if<Straight>(&shape)) return visitor(*straight);
+  return visitor(Undefined{});
+}
+
 // The formula that gives the points and turns of a spiral.
 SpiralShape spiralShape(int mathType, double length, double startRadius, double endRadius) {
   const double k0 = curvatureOf(startRadius);
@@ -186,13 +196,13 @@ double CCurveDataSpiral::getDefiningRadius() const noexcept {
 }
 
 CCurveNE CCurveDataSpiral::getLocalNE(double distance) const noexcept {
-  return std::visit([distance](const auto& shape) { return shape.pointAt(distance); },
-                    spiralShape(mathType_, length_, startRadius_, endRadius_));
+  return onShape(spiralShape(mathType_, length_, startRadius_, endRadius_),
+                 [distance](const auto& shape) { return shape.pointAt(distance); });
 }
 
 double CCurveDataSpiral::getLocalTurn(double distance) const noexcept {
-  return std::visit([distance](const auto& shape) { return shape.turnAt(distance); },
-                    spiralShape(mathType_, length_, startRadius_, endRadius_));
+  return onShape(spiralShape(mathType_, length_, startRadius_, endRadius_),
+                 [distance](const auto& shape) { return shape.turnAt(distance); });
 }
 
 bool CCurveDataSpiral::getLocalIp(CCurveNE& ip) const noexcept {
