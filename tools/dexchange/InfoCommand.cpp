@@ -1,5 +1,6 @@
 #include "Command.h"
 #include "ExchangeRun.h"
+#include "RoadsSummary.h"
 #include "RunReport.h"
 #include "ToolText.h"
 #include "ieObjects/IEData.h"
@@ -18,7 +19,8 @@ class InfoCommand final : public Command {
            "\n"
            "Imports FILE through the plug-in of its format (in a worker thread; Ctrl-C stops) and prints\n"
            "its datasets, objects by kind, codes, layers and coordinate extent; for a point file also the\n"
-           "columns and the delimiter it was read by and how many lines were skipped or kept extra values.\n"
+           "columns and the delimiter it was read by and how many lines were skipped or kept extra values,\n"
+           "and for a file with roads its alignments, their parts and the station-equation sets.\n"
            "A header line that names the columns decides them; otherwise --fields or --order, otherwise\n"
            "Name, Northing, Easting, Ht, FullCodes (PNEZD), and a note says so.\n"
            "\n" +
@@ -61,6 +63,7 @@ class InfoCommand final : public Command {
       streams.out << jsonReport(report);
     } else if (result >= 0) {
       printInfo(streams.out, report);
+      printRoads(streams.out, *report.data);
     }
     return report.error.empty() ? kExitOk : fail(streams, report.exitCode, report.error);
   }

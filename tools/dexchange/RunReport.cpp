@@ -1,7 +1,6 @@
 #include "RunReport.h"
 
 #include <algorithm>
-#include <charconv>
 #include <map>
 
 #include "Json.h"
@@ -38,12 +37,6 @@ const char* kindName(int kind) {
                                        "parcels",         "text labels",
                                        "circles",         "regions"};
   return kind >= 0 && kind < static_cast<int>(std::size(kNames)) ? kNames[kind] : "other objects";
-}
-
-std::string fixed3(double value) {
-  char text[64];
-  const auto end = std::to_chars(text, text + sizeof text, value, std::chars_format::fixed, 3).ptr;
-  return std::string(text, end);
 }
 
 // The smallest and largest of the values seen.

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cctype>
+#include <charconv>
 
 namespace dexchange_tool {
 
@@ -32,6 +33,12 @@ std::vector<std::string> commaItems(const std::string& list) {
     start = comma + 1;
   }
   return items;
+}
+
+std::string fixed3(double value) {
+  char text[64];
+  const auto end = std::to_chars(text, text + sizeof text, value, std::chars_format::fixed, 3).ptr;
+  return std::string(text, end);
 }
 
 }  // namespace dexchange_tool

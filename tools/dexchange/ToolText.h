@@ -13,6 +13,9 @@ std::string utf8(std::wstring_view text);
 CVynStringT<wchar_t> wide(const std::string& text);
 std::string lowerCase(std::string text);
 
+// A value with three decimals ("12.500"), as the tool prints coordinates and stations.
+std::string fixed3(double value);
+
 // The items of a comma-separated option value; empty items are kept (and then refused).
 std::vector<std::string> commaItems(const std::string& list);
 
