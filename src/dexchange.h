@@ -68,6 +68,7 @@
 #include "ieObjects/IEStationEquations.h"
 #include "ieObjects/IESurface.h"
 #include "ieObjects/IETSRawData.h"
+#include "ieObjects/IETSRawRecords.h"
 #include "ieObjects/IETextLabel.h"
 #include "ieObjects/IETimeMS.h"
 #include "ieObjects/IETypedValues.h"
