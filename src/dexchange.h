@@ -61,6 +61,7 @@
 #include "ieObjects/IEPolyLines.h"
 #include "ieObjects/IERawData.h"
 #include "ieObjects/IERawDataEquipment.h"
+#include "ieObjects/IERawDataSummary.h"
 #include "ieObjects/IERegion.h"
 #include "ieObjects/IEScanningSession.h"
 #include "ieObjects/IEStakeoutReports.h"

@@ -89,6 +89,11 @@ IDexTSRawDataInterface* asTotalStation(IDexRawDataInterface* record) {
 
 }  // namespace
 
+// Out of line so that each class has one virtual table and type identity, in the library.
+IDexRawDataInterface::~IDexRawDataInterface() = default;
+
+DexRawNote::~DexRawNote() = default;
+
 DexRawData::DexRawData() : index_(new detail::RawDataNameIndex()) {}
 
 DexRawData::~DexRawData() = default;

@@ -1,4 +1,5 @@
 #include <algorithm>
+#include <array>
 #include <charconv>
 #include <map>
 
@@ -9,6 +10,7 @@
 #include "ieObjects/IEDataset.h"
 #include "ieObjects/IELayers.h"
 #include "ieObjects/IEPoints.h"
+#include "ieObjects/IERawDataSummary.h"
 
 namespace dexchange_tool {
 namespace {
@@ -72,6 +74,38 @@ struct Summary {
   }
 };
 
+// One line per kind that has records: the indent, the kind's name and its count.
+template <std::size_t N>
+void printKinds(std::ostream& out, const char* indent, const char* const (&names)[N],
+                const std::array<int, N>& counts) {
+  for (std::size_t kind = 0; kind < N; ++kind) {
+    if (counts[kind] > 0) out << indent << names[kind] << ": " << counts[kind] << '\n';
+  }
+}
+
+// The raw observations of a dataset: records by kind, the stations set up and the time range.
+void printRawData(std::ostream& out, const vyn::ie::DexRawData& rawData) {
+  static const char* const kRawKinds[] = {"total station", "GNSS", "digital level", "notes", "GNSS and level"};
+  static const char* const kShotKinds[] = {"backbearings",    "backsights", "foresights", "sideshots",
+                                           "missing lines",   "resection shots", "stations", "stakeouts"};
+  static const char* const kGnssKinds[] = {"GNSS offsets", "GNSS base stations", "GNSS positions"};
+  const vyn::ie::DexRawDataSummary summary = vyn::ie::summarizeRawData(rawData);
+  out << "    raw data: " << summary.records << " records\n";
+  printKinds(out, "      ", kRawKinds, summary.byRawKind);
+  if (summary.otherKinds > 0) out << "      other: " << summary.otherKinds << '\n';
+  printKinds(out, "        ", kShotKinds, summary.byTotalStationKind);
+  printKinds(out, "        ", kGnssKinds, summary.byGnssKind);
+  out << "      stations set up: " << summary.stations.GetCount();
+  for (int i = 0; i < summary.stations.GetCount(); ++i)
+    out << (i == 0 ? " (" : ", ") << utf8(summary.stations.GetAt(i));
+  out << (summary.stations.GetCount() > 0 ? ")\n" : "\n");
+  if (summary.hasTime) {
+    constexpr const wchar_t* kTimeFormat = L"%Y-%m-%d %H:%M:%S";
+    out << "      time: " << utf8(summary.firstTime.Format(kTimeFormat)) << " .. "
+        << utf8(summary.lastTime.Format(kTimeFormat)) << '\n';
+  }
+}
+
 void printCounts(std::ostream& out, const std::string& title, const std::map<std::string, int>& counts) {
   out << title << ": " << counts.size() << '\n';
   for (const auto& [name, count] : counts)
@@ -87,8 +121,9 @@ class InfoCommand final : public Command {
            "                          [--units UNIT]\n"
            "\n"
            "Imports FILE through the plug-in of its format (in a worker thread; Ctrl-C stops) and prints\n"
-           "its datasets, objects by kind, codes, layers and coordinate extent. The options are those of\n"
-           "\"dexchange convert\" for the input side.\n"
+           "its datasets, objects by kind, raw observations (records by kind, stations set up, time\n"
+           "range), codes, layers and coordinate extent. The options are those of \"dexchange convert\"\n"
+           "for the input side.\n"
            "\n"
            "Exit codes: 0 shown, 1 the import failed, 2 wrong command line, 130 stopped.\n";
   }
@@ -141,6 +176,8 @@ class InfoCommand final : public Command {
       out << "  \"" << utf8(dataset->getName()) << "\": " << count << " objects\n";
       for (const auto& [kind, number] : own.kinds)
         out << "    " << kindName(kind) << ": " << number << '\n';
+      if (const vyn::ie::DexRawData* const rawData = dataset->getRawData(); rawData != nullptr && rawData->getNumberOfRawData() > 0)
+        printRawData(out, *rawData);
     }
     printCounts(out, "codes", all.codes);
     printCounts(out, "layers", all.layers);
