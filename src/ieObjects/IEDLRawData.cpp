@@ -4,7 +4,8 @@
 
 namespace vyn::ie {
 
-DexDLRawData::DexDLRawData(int contentsType) : contentsType_(static_cast<EDexRawDataContents>(contentsType)) {}
+DexDLRawData::DexDLRawData(int contentsType)
+    : contentsType_(static_cast<EDexRawDataContents>(contentsType)) {}
 
 DexDLRawData::~DexDLRawData() = default;
 

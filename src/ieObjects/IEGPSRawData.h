@@ -14,8 +14,8 @@
 #include "ieObjects/IERawDataEquipment.h"
 #include "ieObjects/IEStation.h"
 #include "ieObjects/IETSRawData.h"
-#include "ieObjects/IETypedValues.h"
 #include "ieObjects/IETimeMS.h"
+#include "ieObjects/IETypedValues.h"
 
 // GNSS raw records (raw kind RAW_DATA_GNSS): the common base, which is at the same time a design point,
 // the base station, the measured position with its precisions, and the points measured by offsets

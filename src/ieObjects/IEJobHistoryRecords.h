@@ -19,11 +19,11 @@ namespace vyn::ie {
 
 // The kind of field operation that produced a raw record. Any value cast from a number is stored.
 enum EDexJobHistoryDataType : std::int32_t {
-  JH_DATA_NONE = -1,            // not made from a job history: the default of the raw records
-  JH_DATA_OCCUPATION = 0,       // occupation of a station (also a resection)
-  JH_DATA_POINT_STAKEOUT = 1,   // stakeout of a point
-  JH_DATA_LINE_STAKEOUT = 2,    // stakeout of a line
-  JH_DATA_SURVEYED_POINT = 3,   // surveyed point
+  JH_DATA_NONE = -1,           // not made from a job history: the default of the raw records
+  JH_DATA_OCCUPATION = 0,      // occupation of a station (also a resection)
+  JH_DATA_POINT_STAKEOUT = 1,  // stakeout of a point
+  JH_DATA_LINE_STAKEOUT = 2,   // stakeout of a line
+  JH_DATA_SURVEYED_POINT = 3,  // surveyed point
 };
 
 // The job, the software and the surveyor under which observations were made, with the temperature,

@@ -31,7 +31,8 @@ bool answersKind(ERawDataType recordKind, ERawDataType type) {
     case IDexRawDataInterface::RAW_DATA_DIGITAL_LEVEL:
       return type == recordKind || type == IDexRawDataInterface::RAW_DATA_GNSS_AND_LEVEL;
     case IDexRawDataInterface::RAW_DATA_GNSS_AND_LEVEL:
-      return type == IDexRawDataInterface::RAW_DATA_GNSS || type == IDexRawDataInterface::RAW_DATA_DIGITAL_LEVEL ||
+      return type == IDexRawDataInterface::RAW_DATA_GNSS ||
+             type == IDexRawDataInterface::RAW_DATA_DIGITAL_LEVEL ||
              type == IDexRawDataInterface::RAW_DATA_GNSS_AND_LEVEL;
     default:
       return false;  // notes, and kinds the library does not know
@@ -83,7 +84,8 @@ void addTimesOf(const IDexRawDataInterface& record, TimeRange& range) {
 }
 
 IDexTSRawDataInterface* asTotalStation(IDexRawDataInterface* record) {
-  if (record == nullptr || record->getRawDataType() != IDexRawDataInterface::RAW_DATA_TOTAL_STATION) return nullptr;
+  if (record == nullptr || record->getRawDataType() != IDexRawDataInterface::RAW_DATA_TOTAL_STATION)
+    return nullptr;
   return dynamic_cast<IDexTSRawDataInterface*>(record);
 }
 
@@ -134,7 +136,8 @@ void DexRawData::reindexRawData() {
 }
 
 bool DexRawData::isHeld(const IDexRawDataInterface& record) const {
-  return findFirstIndex(record.getName(), [&record](const IDexRawDataInterface& held) { return &held == &record; }) >= 0;
+  return findFirstIndex(record.getName(),
+                        [&record](const IDexRawDataInterface& held) { return &held == &record; }) >= 0;
 }
 
 // ---- Searches by name -----------------------------------------------------------------------------
@@ -152,8 +155,10 @@ IDexRawDataInterface* DexRawData::findRawData(IDexRawDataInterface::ERawDataType
 }
 
 IDexRawDataInterface* DexRawData::findFirstRawData(IDexRawDataInterface::ERawDataType type,
-                                                   const CVynStringT<wchar_t>& name, bool onlyActiveSights) const {
-  return const_cast<IDexRawDataInterface*>(records_.at(findFirstIndex(name, kindMatch(type, onlyActiveSights))));
+                                                   const CVynStringT<wchar_t>& name,
+                                                   bool onlyActiveSights) const {
+  return const_cast<IDexRawDataInterface*>(
+      records_.at(findFirstIndex(name, kindMatch(type, onlyActiveSights))));
 }
 
 int DexRawData::firstIndexOfName(const CVynStringT<wchar_t>& name) const {
@@ -185,7 +190,8 @@ bool DexRawData::getRawTime(base::CTime& first, base::CTime& last) const {
   std::array<TimeRange, 3> ranges;  // total station, GNSS, digital level
   for (const IDexRawDataInterface* const record : records_) {
     const int kind = record->getRawDataType();
-    if (kind >= 0 && kind < static_cast<int>(ranges.size())) addTimesOf(*record, ranges[static_cast<std::size_t>(kind)]);
+    if (kind >= 0 && kind < static_cast<int>(ranges.size()))
+      addTimesOf(*record, ranges[static_cast<std::size_t>(kind)]);
   }
   first = base::CTime();
   last = base::CTime();
@@ -207,7 +213,8 @@ void DexRawData::addVAToBkbRecords() {
         backsight->getTSRawData() == nullptr)
       continue;
     DexTSRawData values(*backbearing->getTSRawData());
-    values.setTSRawData(DexTSRawData::THIRD_VALUE, backsight->getTSRawData()->getTSRawData(DexTSRawData::SECOND_VALUE));
+    values.setTSRawData(DexTSRawData::THIRD_VALUE,
+                        backsight->getTSRawData()->getTSRawData(DexTSRawData::SECOND_VALUE));
     backbearing->setTSRawData(&values);
   }
 }

@@ -21,7 +21,8 @@ void addRecord(const IDexRawDataInterface& record, DexRawDataSummary& summary) {
     return;
   }
   count(summary.byRawKind, kind);
-  if (const auto* const shot = dynamic_cast<const IDexTSRawDataInterface*>(&record)) addTotalStation(*shot, summary);
+  if (const auto* const shot = dynamic_cast<const IDexTSRawDataInterface*>(&record))
+    addTotalStation(*shot, summary);
   if (const auto* const gnss = dynamic_cast<const IDexGpsRawDataInterface*>(&record))
     count(summary.byGnssKind, gnss->getGpsRawDataType());
 }

@@ -1,8 +1,8 @@
 #include "ieObjects/IETSRawRecords.h"
 
 #include "hostlibs/VynLogging.h"
-#include "ieObjects/detail/RawRecordCopy.h"
 #include "ieObjects/detail/RawDataLog.h"
+#include "ieObjects/detail/RawRecordCopy.h"
 
 namespace vyn::ie {
 namespace {
@@ -46,7 +46,7 @@ DexTSRawBkb::~DexTSRawBkb() = default;
 
 IDexTSRawDataInterface* DexTSRawBkb::clone() const {
   return detail::makeFilled([] { return new DexTSRawBkb(); },
-                                [this](DexTSRawBkb* copy) { copyCommonData(copy); });
+                            [this](DexTSRawBkb* copy) { copyCommonData(copy); });
 }
 
 void DexTSRawBkb::copyCommonData(DexTSRawDataSightInterface* target) const {
@@ -60,7 +60,7 @@ DexTSRawBS::~DexTSRawBS() = default;
 
 IDexTSRawDataInterface* DexTSRawBS::clone() const {
   return detail::makeFilled([] { return new DexTSRawBS(); },
-                               [this](DexTSRawBS* copy) { copyCommonData(copy); });
+                            [this](DexTSRawBS* copy) { copyCommonData(copy); });
 }
 
 void DexTSRawBS::copyCommonData(DexTSRawDataSightInterface* target) const {
@@ -105,7 +105,7 @@ DexTSRawFS::~DexTSRawFS() = default;
 
 IDexTSRawDataInterface* DexTSRawFS::clone() const {
   return detail::makeFilled([this] { return new DexTSRawFS(measType_, JH_DATA_NONE); },
-                               [this](DexTSRawFS* copy) { copyCommonData(copy); });
+                            [this](DexTSRawFS* copy) { copyCommonData(copy); });
 }
 
 void DexTSRawFS::setSecondData(const DexTSRawData* data) {
@@ -131,7 +131,7 @@ DexTSRawSS::~DexTSRawSS() = default;
 
 IDexTSRawDataInterface* DexTSRawSS::clone() const {
   return detail::makeFilled([this] { return new DexTSRawSS(getMeasType()); },
-                               [this](DexTSRawSS* copy) { copyCommonData(copy); });
+                            [this](DexTSRawSS* copy) { copyCommonData(copy); });
 }
 
 void DexTSRawSS::copyCommonData(DexTSRawDataSightInterface* target) const {
@@ -177,10 +177,10 @@ DexTSRawMlm::~DexTSRawMlm() = default;
 
 IDexTSRawDataInterface* DexTSRawMlm::clone() const {
   return detail::makeFilled([] { return new DexTSRawMlm(); },
-                                [this](DexTSRawMlm* copy) {
-                                  copyData(copy);
-                                  copy->setSecondName(secondName_);
-                                });
+                            [this](DexTSRawMlm* copy) {
+                              copyData(copy);
+                              copy->setSecondName(secondName_);
+                            });
 }
 
 // ---- Resection --------------------------------------------------------------------------------------
@@ -191,12 +191,12 @@ DexTSRawResShot::~DexTSRawResShot() = default;
 
 IDexTSRawDataInterface* DexTSRawResShot::clone() const {
   return detail::makeFilled([] { return new DexTSRawResShot(); },
-                                    [this](DexTSRawResShot* copy) {
-                                      copyData(copy);
-                                      copy->setTSRawDataResidials(copyOrNull(getTSRawDataResidials()));
-                                      copy->setCoords(copyOrNull(getCoords()));
-                                      copy->setUsedData(usedData_);
-                                    });
+                            [this](DexTSRawResShot* copy) {
+                              copyData(copy);
+                              copy->setTSRawDataResidials(copyOrNull(getTSRawDataResidials()));
+                              copy->setCoords(copyOrNull(getCoords()));
+                              copy->setUsedData(usedData_);
+                            });
 }
 
 DexTSRawResection::~DexTSRawResection() = default;
@@ -249,20 +249,21 @@ DexTSRawStn::~DexTSRawStn() = default;
 
 IDexTSRawDataInterface* DexTSRawStn::clone() const {
   return detail::makeFilled([] { return new DexTSRawStn(JH_DATA_NONE); },
-                                [this](DexTSRawStn* copy) {
-                                  copyData(copy);
-                                  copyJobHistory(*this, *copy, copy->jhCopies_);
-                                  copyCodesData(copy);
-                                  copy->note_ = note_;
-                                  copy->scaleFactor_ = scaleFactor_;
-                                  copy->resections_ = resections_;
-                                  copy->additionalData_ = additionalData_;
-                                  copy->photoNotes_ = photoNotes_;
-                                });
+                            [this](DexTSRawStn* copy) {
+                              copyData(copy);
+                              copyJobHistory(*this, *copy, copy->jhCopies_);
+                              copyCodesData(copy);
+                              copy->note_ = note_;
+                              copy->scaleFactor_ = scaleFactor_;
+                              copy->resections_ = resections_;
+                              copy->additionalData_ = additionalData_;
+                              copy->photoNotes_ = photoNotes_;
+                            });
 }
 
 const DexTSRawResection* DexTSRawStn::findTSRawResection(const CVynStringT<wchar_t>& name) const {
-  return resections_.findFirst([&name](const DexTSRawResection& resection) { return resection.getName() == name; });
+  return resections_.findFirst(
+      [&name](const DexTSRawResection& resection) { return resection.getName() == name; });
 }
 
 // ---- Stakeout ---------------------------------------------------------------------------------------
@@ -291,11 +292,11 @@ DexTSRawStakeout::~DexTSRawStakeout() = default;
 
 IDexTSRawDataInterface* DexTSRawStakeout::clone() const {
   return detail::makeFilled([] { return new DexTSRawStakeout(JH_DATA_NONE); },
-                                     [this](DexTSRawStakeout* copy) {
-                                       copyData(copy);
-                                       copyJobHistory(*this, *copy, copy->jhCopies_);
-                                       copy->stations_ = stations_;
-                                     });
+                            [this](DexTSRawStakeout* copy) {
+                              copyData(copy);
+                              copyJobHistory(*this, *copy, copy->jhCopies_);
+                              copy->stations_ = stations_;
+                            });
 }
 
 void DexTSRawStakeout::setStation(int type, const DexStation& station) {

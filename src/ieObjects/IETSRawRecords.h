@@ -365,7 +365,9 @@ class DEX_API DexTSRawStn : public IDexTSRawDataInterface,
 
   // Takes ownership of data (null allowed).
   void setAdditionalResectionData(DexAdditionalResectionData* data) noexcept { additionalData_.reset(data); }
-  const DexAdditionalResectionData* getAdditionalResectionData() const noexcept { return additionalData_.get(); }
+  const DexAdditionalResectionData* getAdditionalResectionData() const noexcept {
+    return additionalData_.get();
+  }
   // Takes ownership of notes (null allowed).
   void setPhotoNotes(DexPhotoNotes* notes) noexcept { photoNotes_.reset(notes); }
   DexPhotoNotes* getPhotoNotes() noexcept { return photoNotes_.get(); }

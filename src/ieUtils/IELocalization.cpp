@@ -48,7 +48,8 @@ void DexLocalization::setAngleAndScale(double angle, double scale) {
   setData(PARAM_SCALE_SIN, std::sin(angle) * scale);
 }
 
-void DexLocalization::addPointCodes(const CVynStringT<wchar_t>& pointName, const DexCodesDataInterface* codes) {
+void DexLocalization::addPointCodes(const CVynStringT<wchar_t>& pointName,
+                                    const DexCodesDataInterface* codes) {
   if (codes == nullptr) return;
   for (DexLocalizationPoint* const point : points_) {
     const DexGpsPosition* const rawData = point->getRawData();

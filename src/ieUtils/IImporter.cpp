@@ -49,7 +49,8 @@ DexImporterImpl::DexImporterImpl(DexData* data, const CVynStringT<wchar_t>& file
 
 DexImporterImpl::~DexImporterImpl() = default;
 
-DexImporterImplWithLocalization::DexImporterImplWithLocalization(DexData* data, const CVynStringT<wchar_t>& fileName,
+DexImporterImplWithLocalization::DexImporterImplWithLocalization(DexData* data,
+                                                                 const CVynStringT<wchar_t>& fileName,
                                                                  const DexFormat* format)
     : DexImporterImpl(data, fileName, format) {}
 

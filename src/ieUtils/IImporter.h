@@ -115,7 +115,8 @@ class DEX_API DexImporterImplWithLocalization : public DexImporterImpl {
 
  protected:
   // The base constructor; no coordinates remembered.
-  DexImporterImplWithLocalization(DexData* data, const CVynStringT<wchar_t>& fileName, const DexFormat* format);
+  DexImporterImplWithLocalization(DexData* data, const CVynStringT<wchar_t>& fileName,
+                                  const DexFormat* format);
   ~DexImporterImplWithLocalization() override;
 
   // Remembers the x, y, z of the plane station of point's observation under the station's name. A

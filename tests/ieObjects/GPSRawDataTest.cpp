@@ -41,8 +41,9 @@ TEST(DexGpsPosition, NewPositionIsAGnssPositionWithoutSolutionOrCounts) {
 
 TEST(DexGpsPosition, SolutionWordsReadBackExactlyAndAnythingElseIsUserInput) {
   const std::pair<int, const wchar_t*> words[] = {
-      {0, L"NO_SOLUTION"}, {1, L"STANDALONE"},  {2, L"CODE_DIFF"},    {3, L"FLOAT"},       {4, L"FIXED"},
-      {6, L"FIXED_SWING"}, {131, L"FLOAT_VRLAS"}, {132, L"FIXED_VRLAS"}, {133, L"USER_INPUT"}, {5, L"USER_INPUT"},
+      {0, L"NO_SOLUTION"},  {1, L"STANDALONE"},  {2, L"CODE_DIFF"},     {3, L"FLOAT"},
+      {4, L"FIXED"},        {6, L"FIXED_SWING"}, {131, L"FLOAT_VRLAS"}, {132, L"FIXED_VRLAS"},
+      {133, L"USER_INPUT"}, {5, L"USER_INPUT"},
   };
   DexGpsPosition position;
   for (const auto& [type, word] : words) {
@@ -116,7 +117,8 @@ TEST(DexGpsCoordCovMatrix, RmsValuesUseTheAbsoluteVariances) {
 }
 
 // A position carrying everything it owns and refers to.
-std::unique_ptr<DexGpsPosition> fullPosition(DexGpsAntennaSettings& antenna, const DexRawDataEquipment& receiver) {
+std::unique_ptr<DexGpsPosition> fullPosition(DexGpsAntennaSettings& antenna,
+                                             const DexRawDataEquipment& receiver) {
   auto position = std::make_unique<DexGpsPosition>();
   position->setName(L"CP1");
   position->setTime(raw_test::at(10, 0));
@@ -246,8 +248,11 @@ TEST(DexGpsOffset, ClonesOfEveryOffsetKeepTheirKindReferencesAndMeasurement) {
     EXPECT_NE(offset.getTSRawData(), copy.getTSRawData());
     EXPECT_EQ(12.0, copy.getTSRawData()->getTSRawData(1));
   }
-  EXPECT_EQ(L"R", dynamic_cast<const DexAzimuthDistanceGpsOffset&>(*std::unique_ptr<DexObject>(azimuth->clone())).getRefPoint());
-  EXPECT_EQ(L"R2", dynamic_cast<const DexPtlGpsOffset&>(*std::unique_ptr<DexObject>(ptl->clone())).getRefPoint2());
+  EXPECT_EQ(L"R",
+            dynamic_cast<const DexAzimuthDistanceGpsOffset&>(*std::unique_ptr<DexObject>(azimuth->clone()))
+                .getRefPoint());
+  EXPECT_EQ(L"R2",
+            dynamic_cast<const DexPtlGpsOffset&>(*std::unique_ptr<DexObject>(ptl->clone())).getRefPoint2());
   const std::unique_ptr<DexObject> twoDistClone(twoDist->clone());
   EXPECT_EQ(L"R1", dynamic_cast<const DexTwoDistGpsOffset&>(*twoDistClone).getRefPoint1());
   EXPECT_TRUE(dynamic_cast<const DexTwoDistGpsOffset&>(*twoDistClone).getRight());

@@ -97,18 +97,20 @@ TEST(DexRawData, FindRawDataAnswersTheLastMatchOfKindNameAndState) {
     int expected;  // index in searchJob(), -1 for none
   };
   const Case cases[] = {
-      {0, L"B", true, false, 2},   {0, L"B", false, false, 2},  {4, L"B", false, false, 2},
-      {3, L"B", false, false, -1}, {0, L"b", false, false, -1}, {0, L"A", true, false, -1},
-      {0, L"A", false, false, 0},  {1, L"G", false, false, 3},  {2, L"G", false, false, -1},
-      {4, L"G", false, false, 3},  {1, L"G4", false, false, 4}, {2, L"G4", false, false, 4},
-      {0, L"G4", false, false, -1}, {2, L"L", false, false, 5}, {1, L"L", false, false, -1},
-      {4, L"A", false, false, 7},  {0, L"A", false, true, -1},  {2, L"A", false, true, 7},
-      {0, L"B", false, true, -1},  {9, L"A", false, false, -1},
+      {0, L"B", true, false, 2},    {0, L"B", false, false, 2},  {4, L"B", false, false, 2},
+      {3, L"B", false, false, -1},  {0, L"b", false, false, -1}, {0, L"A", true, false, -1},
+      {0, L"A", false, false, 0},   {1, L"G", false, false, 3},  {2, L"G", false, false, -1},
+      {4, L"G", false, false, 3},   {1, L"G4", false, false, 4}, {2, L"G4", false, false, 4},
+      {0, L"G4", false, false, -1}, {2, L"L", false, false, 5},  {1, L"L", false, false, -1},
+      {4, L"A", false, false, 7},   {0, L"A", false, true, -1},  {2, L"A", false, true, 7},
+      {0, L"B", false, true, -1},   {9, L"A", false, false, -1},
   };
   const auto job = searchJob();
   for (const Case& c : cases) {
-    const IDexRawDataInterface* const found = job->findRawData(static_cast<Kind>(c.type), c.name, c.onlyActive, c.lastOnly);
-    EXPECT_EQ(c.expected, found != nullptr ? indexOf(*job, found) : -1) << c.type << " " << c.name << " " << c.onlyActive << c.lastOnly;
+    const IDexRawDataInterface* const found =
+        job->findRawData(static_cast<Kind>(c.type), c.name, c.onlyActive, c.lastOnly);
+    EXPECT_EQ(c.expected, found != nullptr ? indexOf(*job, found) : -1)
+        << c.type << " " << c.name << " " << c.onlyActive << c.lastOnly;
   }
 }
 
@@ -127,10 +129,12 @@ const IDexRawDataInterface* walkFor(const DexRawData& rawData, Kind type, const 
   for (int i = 0; i < rawData.getNumberOfRawData(); ++i) {
     const IDexRawDataInterface* const record = rawData.getRawDataAt(i);
     const Kind kind = record->getRawDataType();
-    const bool kindMatches = (kind == 0 && (type == 0 || type == 4)) || ((kind == 1 || kind == 4) && (type == 1 || type == 4)) ||
+    const bool kindMatches = (kind == 0 && (type == 0 || type == 4)) ||
+                             ((kind == 1 || kind == 4) && (type == 1 || type == 4)) ||
                              ((kind == 2 || kind == 4) && (type == 2 || type == 4));
     const auto* const shot = dynamic_cast<const DexTSRawDataSightInterface*>(record);
-    const bool active = shot != nullptr && (shot->getType() == 2 || shot->getType() == 3) && shot->getStateType() == 1;
+    const bool active =
+        shot != nullptr && (shot->getType() == 2 || shot->getType() == 3) && shot->getStateType() == 1;
     if (record->getName() == name && kindMatches && (kind != 0 || !onlyActive || active)) {
       answer = record;
       if (!last) break;
@@ -141,12 +145,18 @@ const IDexRawDataInterface* walkFor(const DexRawData& rawData, Kind type, const 
 
 IDexRawDataInterface* randomRecord(std::mt19937& random, const CVynStringT<wchar_t>& name) {
   switch (random() % 6) {
-    case 0: return named<DexTSRawStn>(name);
-    case 1: return sight<DexTSRawFS>(name, static_cast<State>(random() % 2));
-    case 2: return sight<DexTSRawSS>(name, static_cast<State>(random() % 2));
-    case 3: return position(name, random() % 2 != 0 ? 1 : 4);
-    case 4: return new TestLevelRecord(name);
-    default: return named<DexRawNote>(name);
+    case 0:
+      return named<DexTSRawStn>(name);
+    case 1:
+      return sight<DexTSRawFS>(name, static_cast<State>(random() % 2));
+    case 2:
+      return sight<DexTSRawSS>(name, static_cast<State>(random() % 2));
+    case 3:
+      return position(name, random() % 2 != 0 ? 1 : 4);
+    case 4:
+      return new TestLevelRecord(name);
+    default:
+      return named<DexRawNote>(name);
   }
 }
 
@@ -175,9 +185,11 @@ TEST(DexRawData, IndexedSearchesAnswerAsAWalkThroughAppendsInsertsRemovalsAndRen
       for (int type = 0; type <= 4; ++type) {
         for (const bool onlyActive : {false, true}) {
           const auto kind = static_cast<Kind>(type);
-          ASSERT_EQ(walkFor(rawData, kind, query, onlyActive, true), rawData.findRawData(kind, query, onlyActive, false))
+          ASSERT_EQ(walkFor(rawData, kind, query, onlyActive, true),
+                    rawData.findRawData(kind, query, onlyActive, false))
               << "step " << step;
-          ASSERT_EQ(walkFor(rawData, kind, query, onlyActive, false), rawData.findFirstRawData(kind, query, onlyActive))
+          ASSERT_EQ(walkFor(rawData, kind, query, onlyActive, false),
+                    rawData.findFirstRawData(kind, query, onlyActive))
               << "step " << step;
         }
       }
@@ -217,15 +229,26 @@ TEST(DexRawData, RawTimeTakesEachKindsFirstTimeInListOrderAndTheLatestTime) {
   };
   const Case cases[] = {
       {"GNSS and total station",
-       {timed(position(L"G1"), at(10, 0)), timed(position(L"G2"), at(10, 5)), timed(new DexTSRawFS(), at(9, 30)),
-        timed(new DexTSRawFS(), at(11, 0))},
-       true, at(9, 30), at(11, 0)},
+       {timed(position(L"G1"), at(10, 0)), timed(position(L"G2"), at(10, 5)),
+        timed(new DexTSRawFS(), at(9, 30)), timed(new DexTSRawFS(), at(11, 0))},
+       true,
+       at(9, 30),
+       at(11, 0)},
       {"first in list order, not the earliest",
-       {timed(new DexTSRawFS(), at(10, 0)), timed(new DexTSRawFS(), at(9, 0))}, true, at(10, 0), at(10, 0)},
-      {"resection shots count", {stationWithShotAt(at(8, 0)), timed(new TestLevelRecord(L"L"), at(12, 0))}, true,
-       at(8, 0), at(12, 0)},
-      {"notes and kind 4 do not count", {timed(new DexRawNote(), at(6, 0)), timed(position(L"G", 4), at(7, 0))},
-       false, base::CTime(), base::CTime()},
+       {timed(new DexTSRawFS(), at(10, 0)), timed(new DexTSRawFS(), at(9, 0))},
+       true,
+       at(10, 0),
+       at(10, 0)},
+      {"resection shots count",
+       {stationWithShotAt(at(8, 0)), timed(new TestLevelRecord(L"L"), at(12, 0))},
+       true,
+       at(8, 0),
+       at(12, 0)},
+      {"notes and kind 4 do not count",
+       {timed(new DexRawNote(), at(6, 0)), timed(position(L"G", 4), at(7, 0))},
+       false,
+       base::CTime(),
+       base::CTime()},
       {"records without times", {new DexTSRawFS(), position(L"G")}, false, base::CTime(), base::CTime()},
   };
   for (const Case& c : cases) {
@@ -246,7 +269,8 @@ TEST(DexRawData, RawTimeTakesEachKindsFirstTimeInListOrderAndTheLatestTime) {
 // ---- Names, backbearings, summary -----------------------------------------------------------------
 
 TEST(DexRawData, NumericNamesContinueAfterTheHighestRawName) {
-  const std::unique_ptr<DexRawData> rawData(listOf({named<DexTSRawFS>(L"5"), position(L"12"), named<DexRawNote>(L"X")}));
+  const std::unique_ptr<DexRawData> rawData(
+      listOf({named<DexTSRawFS>(L"5"), position(L"12"), named<DexRawNote>(L"X")}));
   utils::FreeNumericNames names;
   rawData->getMaxNumericRawDataName(names);
   EXPECT_EQ(L"13", names.getFirstAvailableName());
@@ -282,9 +306,9 @@ TEST(DexRawData, BackbearingsTakeTheVerticalAngleOfTheBacksightThatFollows) {
 
 TEST(DexRawData, SummaryCountsKindsStationsAndTimes) {
   const std::unique_ptr<DexRawData> rawData(
-      listOf({timed(named<DexTSRawStn>(L"S1"), at(8, 0)), new DexTSRawBS(), new DexTSRawSS(), new DexTSRawSS(),
-              named<DexTSRawStn>(L"S2"), timed(position(L"G"), at(9, 0)), new DexGpsBaseStation(),
-              new TestLevelRecord(L"L"), new DexRawNote()}));
+      listOf({timed(named<DexTSRawStn>(L"S1"), at(8, 0)), new DexTSRawBS(), new DexTSRawSS(),
+              new DexTSRawSS(), named<DexTSRawStn>(L"S2"), timed(position(L"G"), at(9, 0)),
+              new DexGpsBaseStation(), new TestLevelRecord(L"L"), new DexRawNote()}));
   const DexRawDataSummary summary = summarizeRawData(*rawData);
   EXPECT_EQ(9, summary.records);
   EXPECT_EQ((std::array<int, 5>{5, 2, 1, 1, 0}), summary.byRawKind);

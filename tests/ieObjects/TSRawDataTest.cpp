@@ -102,10 +102,14 @@ struct KindCase {
 };
 
 const KindCase kKinds[] = {
-    {TS_RAW_BACKBEARING, [] { return new DexTSRawBkb(); }}, {TS_RAW_BACKSIGHT, [] { return new DexTSRawBS(); }},
-    {TS_RAW_FORESIGHT, [] { return new DexTSRawFS(); }},    {TS_RAW_SIDESHOT, [] { return new DexTSRawSS(); }},
-    {TS_RAW_MISSING_LINE, [] { return new DexTSRawMlm(); }}, {TS_RAW_RESECTION_SHOT, [] { return new DexTSRawResShot(); }},
-    {TS_RAW_STATION, [] { return new DexTSRawStn(0); }},    {TS_RAW_STAKEOUT, [] { return new DexTSRawStakeout(1); }},
+    {TS_RAW_BACKBEARING, [] { return new DexTSRawBkb(); }},
+    {TS_RAW_BACKSIGHT, [] { return new DexTSRawBS(); }},
+    {TS_RAW_FORESIGHT, [] { return new DexTSRawFS(); }},
+    {TS_RAW_SIDESHOT, [] { return new DexTSRawSS(); }},
+    {TS_RAW_MISSING_LINE, [] { return new DexTSRawMlm(); }},
+    {TS_RAW_RESECTION_SHOT, [] { return new DexTSRawResShot(); }},
+    {TS_RAW_STATION, [] { return new DexTSRawStn(0); }},
+    {TS_RAW_STAKEOUT, [] { return new DexTSRawStakeout(1); }},
 };
 
 TEST(IDexTSRawDataInterface, CloneOfEveryKindCopiesNameTimeHeightAndValuesButNotDepthModelOrInfo) {
@@ -149,7 +153,8 @@ TEST(DexTSRawBS, SightClonesKeepTheirBacksightPointNoteStateAndCoordinates) {
   DexTSRawBkb backbearing;
   backsight.setBSPoint(&point);
   backbearing.setBSPoint(&point);
-  for (DexTSRawDataSightInterface* const sight : std::initializer_list<DexTSRawDataSightInterface*>{&backsight, &backbearing}) {
+  for (DexTSRawDataSightInterface* const sight :
+       std::initializer_list<DexTSRawDataSightInterface*>{&backsight, &backbearing}) {
     sight->setNote(L"check");
     sight->setStateType(IDexStateInterface::INACTIVE_STATE);
     sight->setXyz(1.0, 2.0, 3.0);
@@ -265,7 +270,8 @@ TEST(DexTSRawStn, CloneAndCopiesDuplicateResectionsShotsAndResults) {
     EXPECT_NE(station->getTSRawResectionAt(0), resection);
     ASSERT_EQ(2, resection->getNumberOfTSResShots());
     EXPECT_EQ(L"R1", resection->getTSResShotAt(1)->getName());
-    EXPECT_NE(station->getTSRawResectionAt(0)->getTSResShotAt(1)->getCoords(), resection->getTSResShotAt(1)->getCoords());
+    EXPECT_NE(station->getTSRawResectionAt(0)->getTSResShotAt(1)->getCoords(),
+              resection->getTSResShotAt(1)->getCoords());
     EXPECT_EQ(DexTSRawResShot::USED_HV, resection->getTSResShotAt(1)->getUsedData());
     EXPECT_NE(station->getAdditionalResectionData(), copy->getAdditionalResectionData());
     EXPECT_EQ(1.0, copy->getAdditionalResectionData()->gg);
@@ -310,7 +316,10 @@ TEST(DexTSRawResection, ResectionAndShotNameEachOther) {
     const wchar_t* resectionAfter;
     const wchar_t* shotAfter;
   };
-  const Case cases[] = {{L"R1", L"", L"R1", L"R1"}, {L"", L"P5", L"P5", L"P5"}, {L"R1", L"P5", L"R1", L"P5"}, {L"", L"", L"", L""}};
+  const Case cases[] = {{L"R1", L"", L"R1", L"R1"},
+                        {L"", L"P5", L"P5", L"P5"},
+                        {L"R1", L"P5", L"R1", L"P5"},
+                        {L"", L"", L"", L""}};
   for (const Case& c : cases) {
     DexTSRawResection resection;
     resection.setName(c.resection);
@@ -399,7 +408,10 @@ TEST(DexCommonJobHistoryRecord, EqualIgnoringCaseAndBeyondFourDecimals) {
     double temperature;
     bool equal;
   };
-  const Case cases[] = {{L"job1", 20.00002, true}, {L"JOB1", 20.00001, true}, {L"job1", 20.0002, false}, {L"job2", 20.00001, false}};
+  const Case cases[] = {{L"job1", 20.00002, true},
+                        {L"JOB1", 20.00001, true},
+                        {L"job1", 20.0002, false},
+                        {L"job2", 20.00001, false}};
   DexCommonJobHistoryRecord reference;
   reference.setJobName(L"Job1");
   reference.setTemperature(20.00001);

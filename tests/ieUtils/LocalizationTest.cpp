@@ -9,8 +9,8 @@
 
 #include "ieObjects/IEData.h"
 #include "ieObjects/IEDataDictionary.h"
-#include "ieUtils/IImporter.h"
 #include "ieUtils/IESettings.h"
+#include "ieUtils/IImporter.h"
 
 namespace {
 
@@ -60,9 +60,9 @@ TEST(DexLocalization, AngleAndScaleComeFromParametersTwoAndThree) {
     double angle;
     double scale;
   };
-  const Case cases[] = {{0.0, 2.0, false, pi / 2, 2.0},  {0.0, 2.0, true, pi / 2, 1.0},
+  const Case cases[] = {{0.0, 2.0, false, pi / 2, 2.0},      {0.0, 2.0, true, pi / 2, 1.0},
                         {0.0, -1.0, false, 3 * pi / 2, 1.0}, {-3.0, 0.0, false, pi, 3.0},
-                        {1.0, -1e-17, false, 0.0, 1.0},  {0.0, 0.0, false, 0.0, 0.0}};
+                        {1.0, -1e-17, false, 0.0, 1.0},      {0.0, 0.0, false, 0.0, 0.0}};
   for (const Case& c : cases) {
     DexLocalization localization;
     localization.setData(DexLocalization::PARAM_SCALE_COS, c.cosTerm);
@@ -84,7 +84,8 @@ TEST(DexLocalization, AngleAndScaleComeFromParametersTwoAndThree) {
 }
 
 TEST(DexLocalizationPoint, UsageFlagsReadBackInTheOrderTheyWereSet) {
-  const bool patterns[][3] = {{true, false, false}, {false, true, false}, {false, false, true}, {true, true, false}};
+  const bool patterns[][3] = {
+      {true, false, false}, {false, true, false}, {false, false, true}, {true, true, false}};
   for (const auto& pattern : patterns) {
     DexLocalizationPoint point;
     point.setUsage(pattern[0], pattern[1], pattern[2]);
@@ -187,8 +188,10 @@ TEST(DexImporterImplWithLocalization, RemembersTheFirstStationOfANameAndNeedsALo
     DexPosition3D position;
     bool used;
   };
-  const Case cases[] = {{L"S1", {100.0, 2.0, 3.0}, true},         {L"S1", {200.0, 2.0, 3.0}, false},
-                        {L"S1", {100.0, 2.0, 3.0 + 1e-11}, false}, {L"s1", {100.0, 2.0, 3.0}, false},
+  const Case cases[] = {{L"S1", {100.0, 2.0, 3.0}, true},
+                        {L"S1", {200.0, 2.0, 3.0}, false},
+                        {L"S1", {100.0, 2.0, 3.0 + 1e-11}, false},
+                        {L"s1", {100.0, 2.0, 3.0}, false},
                         {L"S3", {0.0, 2.0, 3.0}, false}};
   const LocalizationImporter copy(importer);
   for (const Case& c : cases) {

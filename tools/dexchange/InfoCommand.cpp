@@ -85,9 +85,10 @@ void printKinds(std::ostream& out, const char* indent, const char* const (&names
 
 // The raw observations of a dataset: records by kind, the stations set up and the time range.
 void printRawData(std::ostream& out, const vyn::ie::DexRawData& rawData) {
-  static const char* const kRawKinds[] = {"total station", "GNSS", "digital level", "notes", "GNSS and level"};
-  static const char* const kShotKinds[] = {"backbearings",    "backsights", "foresights", "sideshots",
-                                           "missing lines",   "resection shots", "stations", "stakeouts"};
+  static const char* const kRawKinds[] = {"total station", "GNSS", "digital level", "notes",
+                                          "GNSS and level"};
+  static const char* const kShotKinds[] = {"backbearings",  "backsights",      "foresights", "sideshots",
+                                           "missing lines", "resection shots", "stations",   "stakeouts"};
   static const char* const kGnssKinds[] = {"GNSS offsets", "GNSS base stations", "GNSS positions"};
   const vyn::ie::DexRawDataSummary summary = vyn::ie::summarizeRawData(rawData);
   out << "    raw data: " << summary.records << " records\n";
@@ -176,7 +177,8 @@ class InfoCommand final : public Command {
       out << "  \"" << utf8(dataset->getName()) << "\": " << count << " objects\n";
       for (const auto& [kind, number] : own.kinds)
         out << "    " << kindName(kind) << ": " << number << '\n';
-      if (const vyn::ie::DexRawData* const rawData = dataset->getRawData(); rawData != nullptr && rawData->getNumberOfRawData() > 0)
+      if (const vyn::ie::DexRawData* const rawData = dataset->getRawData();
+          rawData != nullptr && rawData->getNumberOfRawData() > 0)
         printRawData(out, *rawData);
     }
     printCounts(out, "codes", all.codes);
