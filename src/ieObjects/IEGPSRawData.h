@@ -27,7 +27,7 @@
 // - line 428: the combined geometric dilution does not exceed the time dilution.
 namespace vyn::ie {
 
-class DexGpsAntennaSettings;
+struct DexGpsAntennaSettings;
 
 // The kind of a GNSS record, as IDexGpsRawDataInterface::getGpsRawDataType() answers it.
 enum EDexGpsRawDataType : std::int32_t {

@@ -20,7 +20,7 @@ using namespace vyn::ie;
 using namespace raw_test;
 using Record = IDexTSRawDataInterface;
 
-const std::wstring kSource = detail::kTSRawDataLogSource;
+constexpr const wchar_t* kSource = detail::kTSRawDataLogSource;
 
 TEST(DexTSRawData, PlacesOutsideTheFourValuesReadMinusOneAndAreIgnored) {
   DexTSRawData data(DexTSRawData::CONTENTS_HV);
@@ -101,18 +101,17 @@ struct KindCase {
   std::function<Record*()> make;
 };
 
-const KindCase kKinds[] = {
-    {TS_RAW_BACKBEARING, [] { return new DexTSRawBkb(); }},
-    {TS_RAW_BACKSIGHT, [] { return new DexTSRawBS(); }},
-    {TS_RAW_FORESIGHT, [] { return new DexTSRawFS(); }},
-    {TS_RAW_SIDESHOT, [] { return new DexTSRawSS(); }},
-    {TS_RAW_MISSING_LINE, [] { return new DexTSRawMlm(); }},
-    {TS_RAW_RESECTION_SHOT, [] { return new DexTSRawResShot(); }},
-    {TS_RAW_STATION, [] { return new DexTSRawStn(0); }},
-    {TS_RAW_STAKEOUT, [] { return new DexTSRawStakeout(1); }},
-};
-
 TEST(IDexTSRawDataInterface, CloneOfEveryKindCopiesNameTimeHeightAndValuesButNotDepthModelOrInfo) {
+  const KindCase kKinds[] = {
+      {TS_RAW_BACKBEARING, [] { return new DexTSRawBkb(); }},
+      {TS_RAW_BACKSIGHT, [] { return new DexTSRawBS(); }},
+      {TS_RAW_FORESIGHT, [] { return new DexTSRawFS(); }},
+      {TS_RAW_SIDESHOT, [] { return new DexTSRawSS(); }},
+      {TS_RAW_MISSING_LINE, [] { return new DexTSRawMlm(); }},
+      {TS_RAW_RESECTION_SHOT, [] { return new DexTSRawResShot(); }},
+      {TS_RAW_STATION, [] { return new DexTSRawStn(0); }},
+      {TS_RAW_STAKEOUT, [] { return new DexTSRawStakeout(1); }},
+  };
   for (const KindCase& kind : kKinds) {
     const std::unique_ptr<Record> record(kind.make());
     record->setName(L"P7");
