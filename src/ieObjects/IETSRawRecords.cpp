@@ -40,7 +40,17 @@ T* copyOrNull(const T* object) {
 
 // ---- Backbearing and backsight --------------------------------------------------------------------
 
-DexTSRawBkb::DexTSRawBkb() : DexTSRawDataSightInterface(ACTIVE_STATE) {}
+DexTSRawBackSightBase::DexTSRawBackSightBase() : DexTSRawDataSightInterface(ACTIVE_STATE) {}
+
+DexTSRawBackSightBase::~DexTSRawBackSightBase() = default;
+
+void DexTSRawBackSightBase::copyCommonData(DexTSRawDataSightInterface* target) const {
+  DexTSRawDataSightInterface::copyCommonData(target);
+  if (auto* const sight = dynamic_cast<DexTSRawBackSightBase*>(target); sight != nullptr)
+    sight->bsPoint_ = bsPoint_;
+}
+
+DexTSRawBkb::DexTSRawBkb() = default;
 
 DexTSRawBkb::~DexTSRawBkb() = default;
 
@@ -49,23 +59,13 @@ IDexTSRawDataInterface* DexTSRawBkb::clone() const {
                             [this](DexTSRawBkb* copy) { copyCommonData(copy); });
 }
 
-void DexTSRawBkb::copyCommonData(DexTSRawDataSightInterface* target) const {
-  DexTSRawDataSightInterface::copyCommonData(target);
-  if (auto* const sight = dynamic_cast<DexTSRawBkb*>(target); sight != nullptr) sight->bsPoint_ = bsPoint_;
-}
-
-DexTSRawBS::DexTSRawBS() : DexTSRawDataSightInterface(ACTIVE_STATE) {}
+DexTSRawBS::DexTSRawBS() = default;
 
 DexTSRawBS::~DexTSRawBS() = default;
 
 IDexTSRawDataInterface* DexTSRawBS::clone() const {
   return detail::makeFilled([] { return new DexTSRawBS(); },
                             [this](DexTSRawBS* copy) { copyCommonData(copy); });
-}
-
-void DexTSRawBS::copyCommonData(DexTSRawDataSightInterface* target) const {
-  DexTSRawDataSightInterface::copyCommonData(target);
-  if (auto* const sight = dynamic_cast<DexTSRawBS*>(target); sight != nullptr) sight->bsPoint_ = bsPoint_;
 }
 
 // ---- Foresight --------------------------------------------------------------------------------------

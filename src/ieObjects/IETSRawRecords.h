@@ -37,9 +37,29 @@ class DexDesignPoint;
 
 // ---- Backbearing and backsight --------------------------------------------------------------------
 
-// A backbearing: the sight along the bearing to a backsight point, with a reference to the design
-// point sighted (not owned: a point of the dataset). New sights are active.
-class DEX_API DexTSRawBkb : public DexTSRawDataSightInterface {
+// The part backbearings and backsights share: a sight with a reference to the design point sighted
+// (not owned: a point of the dataset). New sights are active.
+class DEX_API DexTSRawBackSightBase : public DexTSRawDataSightInterface {
+ public:
+  ~DexTSRawBackSightBase() override;
+
+  void setBSPoint(const DexDesignPoint* point) noexcept { bsPoint_ = point; }
+  const DexDesignPoint* getBSPoint() const noexcept { return bsPoint_; }
+
+ protected:
+  DexTSRawBackSightBase();
+  DexTSRawBackSightBase(const DexTSRawBackSightBase&) = default;
+  DexTSRawBackSightBase& operator=(const DexTSRawBackSightBase&) = default;
+
+  // The sight data and the reference to the same backsight point.
+  void copyCommonData(DexTSRawDataSightInterface* target) const override;
+
+ private:
+  const DexDesignPoint* bsPoint_ = nullptr;
+};
+
+// A backbearing: the sight along the bearing to a backsight point.
+class DEX_API DexTSRawBkb : public DexTSRawBackSightBase {
  public:
   VYN_CLASS_ALLOCATOR
 
@@ -52,20 +72,10 @@ class DEX_API DexTSRawBkb : public DexTSRawDataSightInterface {
   EDexTSRawDataType getType() const override { return TS_RAW_BACKBEARING; }
   // The sight data and the reference to the same backsight point.
   IDexTSRawDataInterface* clone() const override;
-
-  void setBSPoint(const DexDesignPoint* point) noexcept { bsPoint_ = point; }
-  const DexDesignPoint* getBSPoint() const noexcept { return bsPoint_; }
-
- protected:
-  void copyCommonData(DexTSRawDataSightInterface* target) const override;
-
- private:
-  const DexDesignPoint* bsPoint_ = nullptr;
 };
 
-// A backsight: the sight to the backsight point that orients a set-up, with a reference to the design
-// point sighted (not owned). New sights are active.
-class DEX_API DexTSRawBS : public DexTSRawDataSightInterface {
+// A backsight: the sight to the backsight point that orients a set-up.
+class DEX_API DexTSRawBS : public DexTSRawBackSightBase {
  public:
   VYN_CLASS_ALLOCATOR
 
@@ -78,15 +88,6 @@ class DEX_API DexTSRawBS : public DexTSRawDataSightInterface {
   EDexTSRawDataType getType() const override { return TS_RAW_BACKSIGHT; }
   // The sight data and the reference to the same backsight point.
   IDexTSRawDataInterface* clone() const override;
-
-  void setBSPoint(const DexDesignPoint* point) noexcept { bsPoint_ = point; }
-  const DexDesignPoint* getBSPoint() const noexcept { return bsPoint_; }
-
- protected:
-  void copyCommonData(DexTSRawDataSightInterface* target) const override;
-
- private:
-  const DexDesignPoint* bsPoint_ = nullptr;
 };
 
 // ---- Foresight and sideshot -----------------------------------------------------------------------
