@@ -164,7 +164,7 @@ TEST(DexRawData, IndexedSearchesAnswerAsAWalkThroughAppendsInsertsRemovalsAndRen
   const CVynStringT<wchar_t> names[] = {L"P1", L"P2", L"P3", L"P4", L"STN", L""};
   std::mt19937 random(20240514);
   DexRawData rawData;
-  for (int step = 0; step < 600; ++step) {
+  for (int step = 0; step < 250; ++step) {
     const int count = rawData.getNumberOfRawData();
     const int operation = static_cast<int>(random() % 20);
     const int at = count > 0 ? static_cast<int>(random() % static_cast<unsigned>(count)) : 0;
