@@ -235,12 +235,18 @@ class DEX_API IDexTSRawDataInterface : public IDexRawDataInterface {
 // an edit state, a note and the coordinates computed for the sight (a value record of its own, owned
 // and duplicated by copies like the measured values).
 //
-// The virtual table continues after getModelName with copyCommonData; the state operations belong to
-// the state interface's table.
+// The virtual table continues after those of the base with copyCommonData; the state operations belong
+// to the state interface's table.
 class DEX_API DexTSRawDataSightInterface : public IDexTSRawDataInterface, public IDexStateInterface {
  public:
   ~DexTSRawDataSightInterface() override;
 
+ protected:
+  // copyData(target), then the note, the state and the coordinates. The sight kinds add their own
+  // fields. A null target, or this record itself, does nothing.
+  virtual void copyCommonData(DexTSRawDataSightInterface* target) const;
+
+ public:
   void setStateType(ECurrentState state) override { state_ = state; }
   ECurrentState getStateType() const override { return state_; }
 
@@ -259,10 +265,6 @@ class DEX_API DexTSRawDataSightInterface : public IDexTSRawDataInterface, public
   explicit DexTSRawDataSightInterface(ECurrentState state);
   DexTSRawDataSightInterface(const DexTSRawDataSightInterface&) = default;
   DexTSRawDataSightInterface& operator=(const DexTSRawDataSightInterface&) = default;
-
-  // copyData(target), then the note, the state and the coordinates. The sight kinds add their own
-  // fields. A null target, or this record itself, does nothing.
-  virtual void copyCommonData(DexTSRawDataSightInterface* target) const;
 
  private:
   CVynStringT<wchar_t> note_;
