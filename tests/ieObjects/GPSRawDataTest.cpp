@@ -190,16 +190,6 @@ TEST(IDexGpsRawDataInterface, ReplacingAnOwnedRecordDeletesThePreviousOne) {
   EXPECT_EQ(2, deletions);
 }
 
-TEST(DexGpsBaseStation, IsAGnssRecordAndAGnssRawPointNamedLikeItsPoint) {
-  DexGpsBaseStation station;
-  EXPECT_EQ(IDexRawDataInterface::RAW_DATA_GNSS, station.getRawDataType());
-  EXPECT_EQ(GPS_RAW_BASE_STATION, station.getGpsRawDataType());
-  EXPECT_EQ(OBJECT_TYPE_GPS_RAW_POINT, station.getType());
-  IDexRawDataInterface& record = station;
-  record.setName(L"BASE");
-  EXPECT_EQ(L"BASE", station.getStation().getName());
-}
-
 TEST(DexGpsBaseStation, CloneCopiesThePointTheRecordAndTheStation) {
   DexGpsBaseStation station;
   station.setName(L"BASE");
@@ -208,7 +198,10 @@ TEST(DexGpsBaseStation, CloneCopiesThePointTheRecordAndTheStation) {
   station.setAntennaType(L"TRM");
   station.setStationIds(3, 4);
   const std::unique_ptr<DexObject> clone(station.clone());
-  const auto& copy = dynamic_cast<const DexGpsBaseStation&>(*clone);
+  auto& copy = dynamic_cast<DexGpsBaseStation&>(*clone);
+  EXPECT_EQ(GPS_RAW_BASE_STATION, copy.getGpsRawDataType());
+  EXPECT_EQ(OBJECT_TYPE_GPS_RAW_POINT, copy.getType());
+  EXPECT_EQ(L"BASE", copy.getStation().getName());
   EXPECT_EQ(3.0, copy.getStation().z);
   EXPECT_EQ(DexPosition3D(4, 5, 6), *copy.getXyzCoords());
   EXPECT_NE(station.getXyzCoords(), copy.getXyzCoords());

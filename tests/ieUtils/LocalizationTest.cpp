@@ -30,7 +30,7 @@ DexLocalizationPoint* controlPoint(const wchar_t* observationName, const wchar_t
   return point;
 }
 
-TEST(DexLocalization, NewLocalizationHasDatumWGS84AndNothingElse) {
+TEST(DexLocalization, NewLocalizationHasDatumWGS84AndParametersOutsideTheTableAreIgnored) {
   const DexLocalization localization;
   EXPECT_EQ(L"WGS84", localization.getDatumName());
   EXPECT_TRUE(localization.getName().IsEmpty());
@@ -40,15 +40,12 @@ TEST(DexLocalization, NewLocalizationHasDatumWGS84AndNothingElse) {
   EXPECT_EQ(0, localization.getNumberOfStations());
   for (int param = 0; param < DexLocalization::kNumberOfParams; ++param)
     EXPECT_EQ(0.0, localization.getData(param)) << param;
-}
-
-TEST(DexLocalization, ParametersOutsideTheTableAreIgnoredAndReadZero) {
-  DexLocalization localization;
+  DexLocalization changed;
   for (const int param : {15, -1, 14})
-    localization.setData(param, 1.0);
-  EXPECT_EQ(0.0, localization.getData(15));
-  EXPECT_EQ(0.0, localization.getData(-1));
-  EXPECT_EQ(1.0, localization.getData(DexLocalization::PARAM_METHOD));
+    changed.setData(param, 1.0);
+  EXPECT_EQ(0.0, changed.getData(15));
+  EXPECT_EQ(0.0, changed.getData(-1));
+  EXPECT_EQ(1.0, changed.getData(DexLocalization::PARAM_METHOD));
 }
 
 TEST(DexLocalization, AngleAndScaleComeFromParametersTwoAndThree) {
