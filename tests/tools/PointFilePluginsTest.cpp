@@ -6,6 +6,8 @@
 #include <cmath>
 #include <cstdio>
 #include <fstream>
+#include <iomanip>
+#include <locale>
 #include <memory>
 #include <sstream>
 #include <string>
@@ -84,9 +86,10 @@ int pointCount(DexData& data) {
 
 std::wstring number(bool defined, double value) {
   if (!defined) return L"-";
-  wchar_t text[64];
-  std::swprintf(text, 64, L"%.3f", value);
-  return text;
+  std::wostringstream text;  // not swprintf: the suite also runs under a comma-decimal locale
+  text.imbue(std::locale::classic());
+  text << std::fixed << std::setprecision(3) << value;
+  return text.str();
 }
 
 // A point as one comparable text: name|north|east|height|codes|notes.

@@ -18,9 +18,10 @@ class InfoCommand final : public Command {
            "                          [--delimiter C] [--units UNIT] [--json]\n"
            "\n"
            "Imports FILE through the plug-in of its format (in a worker thread; Ctrl-C stops) and prints\n"
-           "its datasets, objects by kind, codes, layers and coordinate extent; for a point file also the\n"
-           "columns and the delimiter it was read by and how many lines were skipped or kept extra values,\n"
-           "and for a file with roads its alignments, their parts and the station-equation sets.\n"
+           "its datasets, objects by kind, raw observations (records by kind, stations set up, time\n"
+           "range), codes, layers and coordinate extent; for a point file also the columns and the\n"
+           "delimiter it was read by and how many lines were skipped or kept extra values, and for a\n"
+           "file with roads its alignments, their parts and the station-equation sets.\n"
            "A header line that names the columns decides them; otherwise --fields or --order, otherwise\n"
            "Name, Northing, Easting, Ht, FullCodes (PNEZD), and a note says so.\n"
            "\n" +

@@ -4,6 +4,7 @@
 #include <map>
 
 #include "Json.h"
+#include "RawDataPrint.h"
 #include "ToolText.h"
 #include "ieDefinitions/IEFormatsData.h"
 #include "ieObjects/IEData.h"
@@ -238,10 +239,13 @@ void printInfo(std::ostream& out, const RunReport& report) {
   out << "result:   " << input.outcome.result
       << (input.outcome.result == vyn::ie::DEX_RESULT_OK ? " (ok)" : " (with remarks)") << '\n';
   out << "datasets: " << summary.datasets.size() << '\n';
-  for (const Summary::Dataset& dataset : summary.datasets) {
+  for (std::size_t d = 0; d < summary.datasets.size(); ++d) {
+    const Summary::Dataset& dataset = summary.datasets[d];
     out << "  \"" << dataset.name << "\": " << dataset.objects << " objects\n";
     for (const auto& [kind, number] : dataset.kinds)
       out << "    " << kind << ": " << number << '\n';
+    const vyn::ie::DexRawData* const rawData = report.data->getDatasetAt(static_cast<int>(d))->getRawData();
+    if (rawData != nullptr && rawData->getNumberOfRawData() > 0) printRawData(out, *rawData);
   }
   printCounts(out, "codes", summary.codes);
   printCounts(out, "layers", summary.layers);
