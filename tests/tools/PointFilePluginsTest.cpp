@@ -3,6 +3,7 @@
 
 #include <gtest/gtest.h>
 
+#include <charconv>
 #include <cmath>
 #include <cstdio>
 #include <fstream>
@@ -104,6 +105,13 @@ std::wstring textOf(const DexDesignPoint& point) {
          std::wstring(station.getNotes().view());
 }
 
+// A number of a file as C reads it, whatever the locale (std::stod would follow a comma locale).
+double valueOf(const std::string& text) {
+  double value = std::nan("");
+  std::from_chars(text.data(), text.data() + text.size(), value);
+  return value;
+}
+
 // The values of a line split at delimiter (runs of blanks for the blank).
 std::vector<std::string> valuesOf(const std::string& line, char delimiter) {
   std::vector<std::string> values;
@@ -184,9 +192,9 @@ TEST_F(PointFiles, RealFilesGiveEveryPointWithTheCoordinatesOfItsLine) {
       const DexStation& station = pointAt(data, i).getStation();
       EXPECT_EQ(real.name < 0 ? std::to_string(i + 1) : values[static_cast<std::size_t>(real.name)],
                 dex_test::narrow(pointAt(data, i).getName().view()));
-      EXPECT_EQ(std::stod(values[static_cast<std::size_t>(real.north)]), station.getX()) << line;
-      EXPECT_EQ(std::stod(values[static_cast<std::size_t>(real.east)]), station.getY()) << line;
-      EXPECT_EQ(std::stod(values[static_cast<std::size_t>(real.height)]), station.getZ()) << line;
+      EXPECT_EQ(valueOf(values[static_cast<std::size_t>(real.north)]), station.getX()) << line;
+      EXPECT_EQ(valueOf(values[static_cast<std::size_t>(real.east)]), station.getY()) << line;
+      EXPECT_EQ(valueOf(values[static_cast<std::size_t>(real.height)]), station.getZ()) << line;
     }
     EXPECT_EQ(real.extraLines > 0,
               noted(std::to_wstring(real.extraLines) + L" lines with values after the last column"));
