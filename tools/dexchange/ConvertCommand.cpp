@@ -6,6 +6,7 @@
 #include "ExchangeRun.h"
 #include "ieObjects/IEData.h"
 #include "ieObjects/IEDataset.h"
+#include "ieUtils/IELinework.h"
 
 namespace dexchange_tool {
 namespace {
@@ -51,19 +52,22 @@ class ConvertCommand final : public Command {
   std::string help() const override {
     return std::string(
                "usage: dexchange convert IN OUT [--from FORMAT] [--to FORMAT] [--types LIST]\n"
-               "                        [--fields LIST] [--delimiter C] [--units UNIT] [--force]\n"
+               "                        [--fields LIST] [--delimiter C] [--units UNIT] [--linework]\n"
+               "                        [--force]\n"
                "\n"
                "Imports IN into a data container through the plug-in of its format, then exports the\n"
                "container to OUT, each run in a worker thread (a progress bar on a terminal; Ctrl-C stops\n"
                "the run, and a stopped export leaves no file behind).\n") +
            kOptionsHelp +
+           "  --linework         join the points whose codes carry code strings (EP:1, KERB:L) into one\n"
+           "                     polyline per code and string before the export, and export lines\n"
            "  --force            overwrite OUT when it exists (on a terminal the tool asks; otherwise it\n"
            "                     refuses)\n"
            "\n"
            "Exit codes: 0 converted (notes on stderr tell of skipped lines), 1 the import or export\n"
            "failed, 2 wrong command line, 130 stopped.\n";
   }
-  std::set<std::string> flags() const override { return {"force"}; }
+  std::set<std::string> flags() const override { return {"force", "linework"}; }
   std::set<std::string> valuedOptions() const override {
     return {"from", "to", "types", "fields", "delimiter", "units"};
   }
@@ -80,6 +84,7 @@ class ConvertCommand final : public Command {
     vyn::ie::DexSettings settings;
     if (!makeSettings(arguments, *from->format(), true, settings, error))
       return fail(streams, kExitUsage, "convert: " + error);
+    if (arguments.has("linework")) settings.addDataType(vyn::ie::LINES);
     if (!fileExists(in)) return fail(streams, kExitFailure, "convert: " + in + " not found");
     if (!mayOverwrite(arguments, out, error)) return fail(streams, kExitFailure, "convert: " + error);
 
@@ -90,6 +95,13 @@ class ConvertCommand final : public Command {
     if (imported.result < 0) {
       return fail(streams, exitCodeOf(imported.result),
                   "convert: " + failureText(imported.result, false, in, from->name(), loader));
+    }
+    if (arguments.has("linework")) {
+      vyn::ie::DexData& data = *loader.getIEData();
+      int lines = 0;
+      for (int i = 0; i < data.getNumberOfDatasets(); ++i)
+        lines += vyn::ie::utils::createLineworkFromCodes(*data.getDatasetAt(i));
+      streams.out << "linework: " << lines << " polylines from point codes\n";
     }
     const RunOutcome exported = runInWorker(loader, true, out, *to->format());
     printNotes(streams, exported);
