@@ -92,7 +92,7 @@ void DxfImportReport::malformed(std::string_view type, int line, int code) {
   ++malformed_;
   if (!traceNext()) return;
   const std::string what(type);
-  VYN_TRACE_ALWAYS(L"%ls(%d): %s skipped, group %d is not a number", fileName_.GetString(), line,
+  VYN_TRACE_ALWAYS(L"%ls(%d): %s skipped, group %d is missing or not a number", fileName_.GetString(), line,
                    what.c_str(), code);
 }
 
@@ -737,21 +737,29 @@ DexSurface* DxfObjectBuilder::surfaceFor(DxfRecord& record, const Extras& extras
   return surface;
 }
 
-void DxfObjectBuilder::addTriangle(DexSurface& surface, const Vertex& a, const Vertex& b, const Vertex& c) {
+struct DxfObjectBuilder::Faces {
+  DxfRecord& record;
+  const Extras& extras;
+  DexSurface* surface = nullptr;
+};
+
+void DxfObjectBuilder::addTriangle(Faces& faces, const Vertex& a, const Vertex& b, const Vertex& c) {
+  const auto same = [](const Vertex& p, const Vertex& q) { return p.x == q.x && p.y == q.y && p.z == q.z; };
+  if (same(a, b) || same(b, c) || same(a, c)) {
+    report_.notHeld("surface faces without area");
+    return;
+  }
+  if (faces.surface == nullptr) faces.surface = surfaceFor(faces.record, faces.extras);
   int corners[3];
   const Vertex* vertices[3] = {&a, &b, &c};
   for (int k = 0; k < 3; ++k) {
     const DexPosition3D position(meters(vertices[k]->y), meters(vertices[k]->x), meters(vertices[k]->z));
-    corners[k] = surface.getPositionIndex(position);
-    if (corners[k] < 0) corners[k] = surface.addPosition(position);
-  }
-  if (corners[0] == corners[1] || corners[1] == corners[2] || corners[0] == corners[2]) {
-    report_.notHeld("surface faces without area");
-    return;
+    corners[k] = faces.surface->getPositionIndex(position);
+    if (corners[k] < 0) corners[k] = faces.surface->addPosition(position);
   }
   auto* triangle = new DexTriangle();
   triangle->setPositions(corners);
-  surface.addTriangle(triangle);
+  faces.surface->addTriangle(triangle);
 }
 
 void DxfObjectBuilder::addFace(DxfRecord& record) {
@@ -762,17 +770,17 @@ void DxfObjectBuilder::addFace(DxfRecord& record) {
   if (record.has(group::kX + 3)) pointAt(record, group::kX + 3, false, corners[3]);
   const Extras extras = readExtras(record);
   if (skipMalformed(record)) return;
-  DexSurface* surface = surfaceFor(record, extras);
-  addTriangle(*surface, corners[0], corners[1], corners[2]);
+  Faces faces{record, extras};
+  addTriangle(faces, corners[0], corners[1], corners[2]);
   const bool quad =
       corners[3].x != corners[2].x || corners[3].y != corners[2].y || corners[3].z != corners[2].z;
-  if (quad) addTriangle(*surface, corners[0], corners[2], corners[3]);
+  if (quad) addTriangle(faces, corners[0], corners[2], corners[3]);
 }
 
 void DxfObjectBuilder::makeSurfaceFaces(DxfRecord& record, const std::vector<Vertex>& vertices, int flags) {
   const Extras extras = readExtras(record);
   if (skipMalformed(record)) return;
-  DexSurface* surface = surfaceFor(record, extras);
+  Faces faces{record, extras};
   if ((flags & polyline_flag::kPolyfaceMesh) != 0) {
     std::vector<const Vertex*> positions;
     for (const Vertex& vertex : vertices) {
@@ -791,9 +799,9 @@ void DxfObjectBuilder::makeSurfaceFaces(DxfRecord& record, const std::vector<Ver
         report_.notHeld("mesh faces without their vertices");
         continue;
       }
-      addTriangle(*surface, *a, *b, *c);
+      addTriangle(faces, *a, *b, *c);
       if (const Vertex* d = face.corners[3] != 0 ? corner(face.corners[3]) : nullptr; d != nullptr)
-        addTriangle(*surface, *a, *c, *d);
+        addTriangle(faces, *a, *c, *d);
     }
     return;
   }
@@ -811,8 +819,8 @@ void DxfObjectBuilder::makeSurfaceFaces(DxfRecord& record, const std::vector<Ver
   };
   for (long long row = 0; row + 1 < rows; ++row) {
     for (long long column = 0; column + 1 < columns; ++column) {
-      addTriangle(*surface, at(row, column), at(row, column + 1), at(row + 1, column + 1));
-      addTriangle(*surface, at(row, column), at(row + 1, column + 1), at(row + 1, column));
+      addTriangle(faces, at(row, column), at(row, column + 1), at(row + 1, column + 1));
+      addTriangle(faces, at(row, column), at(row + 1, column + 1), at(row + 1, column));
     }
   }
 }

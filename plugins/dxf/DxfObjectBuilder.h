@@ -113,7 +113,9 @@ class DxfObjectBuilder {
   // drawing coordinates and file units.
   void makeLine(DxfRecord& record, const std::vector<Vertex>& vertices, bool closed, bool heights);
   void makeSurfaceFaces(DxfRecord& record, const std::vector<Vertex>& vertices, int flags);
-  void addTriangle(DexSurface& surface, const Vertex& a, const Vertex& b, const Vertex& c);
+  // The triangles of one entity; their surface is found (or made) with the first of them.
+  struct Faces;
+  void addTriangle(Faces& faces, const Vertex& a, const Vertex& b, const Vertex& c);
   DexSurface* surfaceFor(DxfRecord& record, const Extras& extras);
 
   // Common parts.

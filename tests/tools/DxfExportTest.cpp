@@ -171,8 +171,9 @@ TEST_F(DxfExport, DrawingsEzdxfAndGdalWriteFromTheModelAreReadWithTheSameCounts)
   const std::map<std::string, int> expected = dxf_test::countByKindAndLayer(*original->getIEData());
   for (const char* version : {"R12", "R2000", "R2018"}) {
     const std::string path = dir_.file(std::string("ezdxf_") + version + ".dxf");
-    const dex_test::ToolProcess run = dex_test::runScript("/usr/bin/python3 '" + kPeers + "' ezdxf " + version +
-                                                          " '" + dir_.file("drawing.dxf") + "' '" + path + "'");
+    const dex_test::ToolProcess run =
+        dex_test::runScript("/usr/bin/python3 '" + kPeers + "' ezdxf " + version + " '" +
+                            dir_.file("drawing.dxf") + "' '" + path + "'");
     ASSERT_EQ(0, run.exitCode) << run.output;
     const auto back = readBack(path);
     EXPECT_EQ(expected, dxf_test::countByKindAndLayer(*back->getIEData())) << version;

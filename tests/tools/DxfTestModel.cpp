@@ -284,9 +284,9 @@ std::vector<std::string> describe(DexData& data) {
     DexDrawLineProperties::EDashStyleType dash{};
     unsigned char width = 0;
     lines.push_back("layer '" + utf8(layer.getName()) +
-                    "' color=" + (line->getColor(color) ? std::to_string(color) : "-") +
-                    " dash=" + (line->getDashStyle(dash) ? std::to_string(dash) : "-") +
-                    " width=" + (line->getWidth(width) ? std::to_string(width) : "-") +
+                    "' color=" + (line != nullptr && line->getColor(color) ? std::to_string(color) : "-") +
+                    " dash=" + (line != nullptr && line->getDashStyle(dash) ? std::to_string(dash) : "-") +
+                    " width=" + (line != nullptr && line->getWidth(width) ? std::to_string(width) : "-") +
                     (layer.isActive() ? "" : " off") + (layer.isPlot() ? "" : " not plotted"));
   }
   DexDataset& dataset = *data.getCurDataset();
