@@ -484,7 +484,7 @@ void DxfEntityWriter::writeArc(const DexArc& arc) {
   beginEntity(word::kArc, layerName(arc.getLayer()), styleOf(arc, IDexDrawProperties::DRAW_LINE, true));
   writer_.group(100, "AcDbCircle");
   position(10, x(centre), y(centre), units(centre.getZ()));
-  writer_.real(40, units(arc.getData(DexArc::ARC_RADIUS)), lengthDecimals_);
+  writer_.exact(40, units(arc.getData(DexArc::ARC_RADIUS)));
   writer_.group(100, "AcDbArc");
   // An arc of the drawing runs counter-clockwise from its start to its end.
   const double start = arc.getData(DexArc::ARC_START_ANGLE);
@@ -502,7 +502,7 @@ void DxfEntityWriter::writeCircle(const DexCircle& circle) {
               styleOf(circle, IDexDrawProperties::DRAW_LINE, true));
   writer_.group(100, "AcDbCircle");
   position(10, x(centre), y(centre), units(centre.getZ()));
-  writer_.real(40, units(circle.getData(DexCircle::CIRCLE_RADIUS)), lengthDecimals_);
+  writer_.exact(40, units(circle.getData(DexCircle::CIRCLE_RADIUS)));
   writeExtras(extras);
 }
 

@@ -339,11 +339,17 @@ bool DxfObjectBuilder::pointAt(DxfRecord& record, int code, bool ocs, Vertex& ve
   vertex.x = record.realAt(static_cast<std::size_t>(xAt), 0.0);
   vertex.y = record.realAt(static_cast<std::size_t>(yAt), 0.0);
   vertex.z = record.real(code + kToZ, 0.0);
-  if (!ocs || !record.has(group::kExtrusionZ)) return true;
-  const double nx = record.real(group::kExtrusionX, 0.0);
-  const double ny = record.real(group::kExtrusionY, 0.0);
-  const double nz = record.real(group::kExtrusionZ, 1.0);
-  styles_.cad().convertCPInOcsToWcs(vertex.x, vertex.y, vertex.z, nx, ny, nz, vertex.x, vertex.y, vertex.z);
+  if (ocs && record.has(group::kExtrusionZ)) {
+    const double nx = record.real(group::kExtrusionX, 0.0);
+    const double ny = record.real(group::kExtrusionY, 0.0);
+    const double nz = record.real(group::kExtrusionZ, 1.0);
+    styles_.cad().convertCPInOcsToWcs(vertex.x, vertex.y, vertex.z, nx, ny, nz, vertex.x, vertex.y, vertex.z);
+  }
+  // A coordinate the unit conversion (or the plane) takes beyond the doubles is no coordinate.
+  if (!isFiniteLength(vertex.x) || !isFiniteLength(vertex.y) || !isFiniteLength(vertex.z)) {
+    record.markMalformed(code);
+    return false;
+  }
   return true;
 }
 
@@ -647,7 +653,7 @@ void DxfObjectBuilder::addArc(DxfRecord& record, bool circle) {
   const Extras extras = readExtras(record);
   const Style style = readStyle(record);
   if (skipMalformed(record)) return;
-  if (!(radius > 0.0)) {
+  if (!(radius > 0.0) || !isFiniteLength(radius)) {
     report_.notHeld(std::string(record.type()) + " entities without a radius");
     return;
   }
@@ -707,6 +713,7 @@ void DxfObjectBuilder::addText(DxfRecord& record, bool mtext) {
     if (normalZ < 0.0) rotation = kHalfTurn - rotation;
   }
   const double height = record.real(group::kRadius, 0.0);
+  if (!isFiniteLength(height)) record.markMalformed(group::kRadius);
   const Extras extras = readExtras(record);
   const Style style = readStyle(record);
   if (skipMalformed(record)) return;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <cmath>
 #include <map>
 #include <memory>
 #include <string>
@@ -11,6 +12,7 @@
 #include "DxfStyles.h"
 #include "DxfText.h"
 #include "hostlibs/VynString.h"
+#include "ieUtils/IEUtilsUnits.h"
 #include "pointfiles/CodeText.h"
 
 namespace vyn::ie {
@@ -132,6 +134,10 @@ class DxfObjectBuilder {
   bool horizontal(DxfRecord& record, double& normalZ);
   CVynStringT<wchar_t> wide(std::string_view bytes) { return CVynStringT<wchar_t>(decoder_.plain(bytes)); }
   double meters(double value) const noexcept { return value * toMeters_; }
+  // A length the model can hold: finite in meters and not its no-value marker.
+  bool isFiniteLength(double value) const noexcept {
+    return std::isfinite(meters(value)) && std::fabs(meters(value)) < kNoValue;
+  }
 
   DexData& data_;
   DexDataset* dataset_;
