@@ -3,6 +3,8 @@
 set -euo pipefail
 
 packages=(cmake g++ make pkg-config libxml2-dev googletest libgtest-dev libgmock-dev libbenchmark-dev locales)
+# The independent DXF readers and writers the DXF tests compare against (/usr/bin/python3 sees python3-ezdxf).
+packages+=(python3-ezdxf gdal-bin)
 if [[ "${DEXCHANGE_FUZZ:-}" == "ON" ]]; then
   packages+=(clang libclang-rt-dev)
 fi
