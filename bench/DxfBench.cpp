@@ -2,7 +2,7 @@
 // plug-ins and the loader: its import into the model and its export from it. The drawing is the
 // exporter's own (each point a POINT and an INSERT with its NAME, HEIGHT and CODE attributes), written
 // from a generated model when DEXCHANGE_BENCH_DXF is missing. Run one benchmark per process
-// (bench/dxf.sh does, with GDAL's ogr2ogr on the same file) so that each reports its own peak memory.
+// (bench/dxf.sh does, with GDAL's ogr2ogr on the same file and the peak memory of each process).
 
 #include <benchmark/benchmark.h>
 
@@ -57,7 +57,8 @@ void fillSurvey(DexData& data) {
   for (int i = 0; i < kLayerCount; ++i) {
     auto* layer = new DexLayer();
     layer->setName(CVynStringT<wchar_t>(std::to_wstring(i).insert(0, L"LAYER_").c_str()));
-    auto* line = new DexDrawLineProperties(static_cast<unsigned long>(0x102030 * (i + 1)), 1, DexDrawLineProperties::DASH_SOLID);
+    auto* line = new DexDrawLineProperties(static_cast<unsigned long>(0x102030 * (i + 1)), 1,
+                                           DexDrawLineProperties::DASH_SOLID);
     layer->setDrawProperties(IDexDrawProperties::DRAW_LINE, line);
     data.getIEDrawDictionary()->addLayer(layer);
     layers.push_back(layer);
@@ -73,8 +74,8 @@ void fillSurvey(DexData& data) {
   for (int i = 0; i < kPointCount; ++i) {
     auto* point = new DexDesignPoint();
     point->setName(CVynStringT<wchar_t>(std::to_wstring(100000 + i).c_str()));
-    point->setCoords(5432000.0 + (i % 1000) * 0.731 + (i / 1000) * 0.377, 312000.0 + (i / 1000) * 0.913 - (i % 1000) * 0.041,
-                     84.0 + (i % 977) * 0.0123);
+    point->setCoords(5432000.0 + (i % 1000) * 0.731 + (i / 1000) * 0.377,
+                     312000.0 + (i / 1000) * 0.913 - (i % 1000) * 0.041, 84.0 + (i % 977) * 0.0123);
     auto* code = new DexCodeValues(codes[static_cast<std::size_t>(i) % codes.size()]);
     if (i % 3 == 1) code->addCodeString(L"1");
     point->addCode(code);
@@ -107,19 +108,9 @@ const std::string& drawing() {
   return path;
 }
 
-double peakMegabytes() {
-  std::ifstream status("/proc/self/status");
-  std::string line;
-  while (std::getline(status, line)) {
-    if (line.rfind("VmHWM:", 0) == 0) return std::stod(line.substr(6)) / 1024.0;
-  }
-  return 0.0;
-}
-
 void report(benchmark::State& state, std::int64_t objects) {
   state.SetItemsProcessed(objects);
   state.counters["objects"] = static_cast<double>(objects);
-  state.counters["peak_MB"] = peakMegabytes();
 }
 
 void LoaderImport(benchmark::State& state) {
@@ -149,7 +140,8 @@ void LoaderExport(benchmark::State& state) {
   const std::string out = drawingFile() + ".out.dxf";
   for (auto _ : state) {
     std::remove(out.c_str());
-    if (loader.exportInTheSameThread(wide(out), getIEFormatsData().getFormatById(kDxfId), nullptr) != DEX_RESULT_OK)
+    if (loader.exportInTheSameThread(wide(out), getIEFormatsData().getFormatById(kDxfId), nullptr) !=
+        DEX_RESULT_OK)
       state.SkipWithError("the export failed");
   }
   std::remove(out.c_str());

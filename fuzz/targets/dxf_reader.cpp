@@ -97,7 +97,8 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
 
   DexData first(settings);
   const EDexResult read = run(first, input.wpath(), false);
-  DEX_FUZZ_CHECK(read == DEX_RESULT_OK || read == dxf::kResultEntitiesSkipped || read == DEX_RESULT_WRONG_FORMAT);
+  DEX_FUZZ_CHECK(read == DEX_RESULT_OK || read == dxf::kResultEntitiesSkipped ||
+                 read == DEX_RESULT_WRONG_FORMAT);
   const Content taken = contentOf(first);
   if (read == DEX_RESULT_WRONG_FORMAT) DEX_FUZZ_CHECK(taken.objects == 0 && taken.triangles == 0);
 
@@ -108,7 +109,8 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
   DEX_FUZZ_CHECK(again.objects == taken.objects);
   DEX_FUZZ_CHECK(again.regions == taken.regions);
   // Corners nearer than the written decimals fall together: such a triangle is left out, and said so.
-  DEX_FUZZ_CHECK(readAgain == DEX_RESULT_OK ? again.triangles == taken.triangles
-                                            : readAgain == dxf::kResultEntitiesSkipped && again.triangles < taken.triangles);
+  DEX_FUZZ_CHECK(readAgain == DEX_RESULT_OK
+                     ? again.triangles == taken.triangles
+                     : readAgain == dxf::kResultEntitiesSkipped && again.triangles < taken.triangles);
   return 0;
 }

@@ -7,6 +7,7 @@
 #include <charconv>
 #include <cmath>
 #include <cstring>
+#include <memory>
 
 #include "DxfWords.h"
 
@@ -68,7 +69,7 @@ bool parseInteger(std::string_view text, long long& value) {
   return true;
 }
 
-DxfGroupReader::DxfGroupReader() : buffer_(kBlockSize) {}
+DxfGroupReader::DxfGroupReader() = default;
 
 DxfGroupReader::~DxfGroupReader() {
   if (file_ != nullptr) std::fclose(file_);
@@ -79,8 +80,12 @@ bool DxfGroupReader::open(const std::string& path) {
   if (file_ == nullptr) return false;
   struct stat info {};
   if (::stat(path.c_str(), &info) == 0) fileSize_ = static_cast<std::uint64_t>(info.st_size);
+  // Room for the whole of a small file, and always for a line at the limit and its line end.
+  capacity_ =
+      static_cast<std::size_t>(std::min<std::uint64_t>(kBlockSize, fileSize_ + 1)) + kMaxLineBytes + 2;
+  buffer_ = std::make_unique_for_overwrite<char[]>(capacity_);
   fill();
-  std::string_view head(buffer_.data() + begin_, end_ - begin_);
+  std::string_view head(buffer_.get() + begin_, end_ - begin_);
   if (head.substr(0, kUtf8Mark.size()) == kUtf8Mark) {
     begin_ += kUtf8Mark.size();
     consumed_ += kUtf8Mark.size();
@@ -93,11 +98,11 @@ bool DxfGroupReader::open(const std::string& path) {
 bool DxfGroupReader::fill() {
   if (atEnd_ || file_ == nullptr) return false;
   if (begin_ > 0) {
-    std::memmove(buffer_.data(), buffer_.data() + begin_, end_ - begin_);
+    std::memmove(buffer_.get(), buffer_.get() + begin_, end_ - begin_);
     end_ -= begin_;
     begin_ = 0;
   }
-  const std::size_t read = std::fread(buffer_.data() + end_, 1, buffer_.size() - end_, file_);
+  const std::size_t read = std::fread(buffer_.get() + end_, 1, capacity_ - end_, file_);
   end_ += read;
   if (read == 0) atEnd_ = true;
   return read > 0;
@@ -106,7 +111,7 @@ bool DxfGroupReader::fill() {
 bool DxfGroupReader::readLine(std::string_view& line, bool& cut) {
   cut = false;
   for (;;) {
-    const char* start = buffer_.data() + begin_;
+    const char* start = buffer_.get() + begin_;
     const auto* newline = static_cast<const char*>(std::memchr(start, '\n', end_ - begin_));
     if (newline != nullptr || (atEnd_ && begin_ < end_)) {
       const std::size_t length =
@@ -128,9 +133,9 @@ bool DxfGroupReader::readLine(std::string_view& line, bool& cut) {
     fill();
   }
   // A line longer than the limit: keep its head, pass over the rest up to its line end.
-  longLine_.assign(buffer_.data() + begin_, kMaxLineBytes);
+  longLine_.assign(buffer_.get() + begin_, kMaxLineBytes);
   for (;;) {
-    const char* start = buffer_.data() + begin_;
+    const char* start = buffer_.get() + begin_;
     const auto* newline = static_cast<const char*>(std::memchr(start, '\n', end_ - begin_));
     const std::size_t used =
         newline != nullptr ? static_cast<std::size_t>(newline - start) + 1 : end_ - begin_;

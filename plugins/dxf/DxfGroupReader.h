@@ -2,9 +2,9 @@
 
 #include <cstdint>
 #include <cstdio>
+#include <memory>
 #include <string>
 #include <string_view>
-#include <vector>
 
 // Reading a DXF file group by group, in blocks: the file is never held whole.
 namespace vyn::ie::dxf {
@@ -58,7 +58,8 @@ class DxfGroupReader {
   bool fill();
 
   std::FILE* file_ = nullptr;
-  std::vector<char> buffer_;
+  std::unique_ptr<char[]> buffer_;
+  std::size_t capacity_ = 0;
   std::size_t begin_ = 0;  // the first byte not yet read
   std::size_t end_ = 0;    // one past the last byte in the buffer
   bool atEnd_ = false;     // the file has no more bytes

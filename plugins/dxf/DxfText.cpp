@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <array>
+#include <cstdint>
 #include <cwctype>
 
 #include "hostlibs/VynString.h"
@@ -103,7 +104,7 @@ void appendEscaped(std::string& out, unsigned unit) {
 }
 
 void appendCharacter(std::string& out, wchar_t ch) {
-  const auto value = static_cast<unsigned>(ch);
+  const auto value = static_cast<std::uint32_t>(static_cast<char32_t>(ch));
   if (value < 0x20 || value == 0x7F) {
     out += ' ';
   } else if (value < 0x7F) {

@@ -61,7 +61,6 @@ DxfWriter::~DxfWriter() {
 
 bool DxfWriter::open(const std::string& path) {
   file_ = std::fopen(path.c_str(), "wb");
-  buffer_.reserve(kFlushBytes + 4096);
   return file_ != nullptr;
 }
 
