@@ -1,6 +1,7 @@
 #include "DxfStyles.h"
 
 #include <algorithm>
+#include <unordered_map>
 
 namespace vyn::ie::dxf {
 
@@ -8,12 +9,19 @@ namespace {
 
 constexpr unsigned long kByteMask = 0xFFu;
 
-}  // namespace
-
-DxfStyles::DxfStyles() {
-  for (int index = DexAutoCadUtils::kPaletteSize - 1; index >= 1; --index)
-    exactIndexes_[cad_.convert256ToRgb(index)] = index;
+// The lowest palette index from 1 of each colour of the palette.
+const std::unordered_map<unsigned long, int>& exactIndexes() {
+  static const std::unordered_map<unsigned long, int> kIndexes = [] {
+    const DexAutoCadUtils cad;
+    std::unordered_map<unsigned long, int> indexes;
+    for (int index = DexAutoCadUtils::kPaletteSize - 1; index >= 1; --index)
+      indexes[cad.convert256ToRgb(index)] = index;
+    return indexes;
+  }();
+  return kIndexes;
 }
+
+}  // namespace
 
 unsigned long DxfStyles::colorOfTrueColor(long long trueColor) {
   const auto value = static_cast<unsigned long>(trueColor);
@@ -32,7 +40,7 @@ long long DxfStyles::trueColorOf(unsigned long color) {
 
 int DxfStyles::indexOf(unsigned long color, bool& exact) const {
   color &= 0xFFFFFFu;
-  if (const auto found = exactIndexes_.find(color); found != exactIndexes_.end()) {
+  if (const auto found = exactIndexes().find(color); found != exactIndexes().end()) {
     exact = true;
     return found->second;
   }

@@ -2,7 +2,6 @@
 
 #include <string>
 #include <string_view>
-#include <unordered_map>
 
 #include "ieObjects/IEDrawProperties.h"
 #include "ieUtils/IEAutoCADUtils.h"
@@ -15,7 +14,6 @@ namespace vyn::ie::dxf {
 // 0x00RRGGBB.
 class DxfStyles {
  public:
-  DxfStyles();
 
   // The model colour of a palette index (1 to 255); of a true colour.
   unsigned long colorOfIndex(int index) const { return cad_.convert256ToRgb(index); }
@@ -38,7 +36,6 @@ class DxfStyles {
 
  private:
   DexAutoCadUtils cad_;
-  std::unordered_map<unsigned long, int> exactIndexes_;
 };
 
 }  // namespace vyn::ie::dxf
