@@ -389,11 +389,11 @@ void DxfEntityWriter::writePoint(const DexDesignPoint& point) {
     position(10, px + tag.dx * textHeight, py + tag.dy * textHeight, pz);
     writer_.real(40, textHeight, lengthDecimals_);
     if (tag.tag == kNameTag) {
-      writer_.text(1, point.getName().view());
+      writer_.text(1, withControlCodesEscaped(point.getName().view()));
     } else if (tag.tag == kHeightTag) {
       writer_.group(1, height);
     } else {
-      writer_.text(1, codes);
+      writer_.text(1, withControlCodesEscaped(codes));
     }
     writer_.group(100, "AcDbAttribute");
     writer_.group(2, tag.tag);
@@ -547,7 +547,7 @@ void DxfEntityWriter::writeLabel(const DexTextLabel& label) {
   writer_.group(100, "AcDbText");
   position(10, px, py, pz);
   writer_.real(40, height, lengthDecimals_);
-  writer_.text(1, text);
+  writer_.text(1, withControlCodesEscaped(text));
   if (rotation != 0.0) writer_.exact(50, rotation);
   if (horizontal != 0) writer_.group(72, horizontal);
   if (horizontal != 0 || vertical != 0) position(11, px, py, pz);

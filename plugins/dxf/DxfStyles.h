@@ -14,7 +14,6 @@ namespace vyn::ie::dxf {
 // 0x00RRGGBB.
 class DxfStyles {
  public:
-
   // The model colour of a palette index (1 to 255); of a true colour.
   unsigned long colorOfIndex(int index) const { return cad_.convert256ToRgb(index); }
   static unsigned long colorOfTrueColor(long long trueColor);

@@ -267,6 +267,13 @@ void appendEncoded(std::string& out, std::wstring_view text) {
     appendCharacter(out, ch);
 }
 
+std::wstring withControlCodesEscaped(std::wstring_view text) {
+  std::wstring escaped(text);
+  for (std::size_t at = escaped.find(L"%%"); at != std::wstring::npos; at = escaped.find(L"%%", at + 6))
+    escaped.replace(at, 2, L"%%%%%%");
+  return escaped;
+}
+
 void appendMTextEncoded(std::string& out, std::wstring_view text) {
   for (const wchar_t ch : text) {
     if (ch == L'\n') {

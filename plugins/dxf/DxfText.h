@@ -41,6 +41,9 @@ class DxfTextDecoder {
 // Appends text as the bytes of a group value: ASCII as it is, every other character as "\U+XXXX",
 // control characters (line ends among them) as blanks.
 void appendEncoded(std::string& out, std::wstring_view text);
+// text for the value of TEXT or ATTRIB: each "%%" written so that it reads back as itself, not as a
+// control code.
+std::wstring withControlCodesEscaped(std::wstring_view text);
 // Appends text as the value of MTEXT: as appendEncoded, with "\n" written as "\P" and "\", "{" and "}"
 // escaped.
 void appendMTextEncoded(std::string& out, std::wstring_view text);

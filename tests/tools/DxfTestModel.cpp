@@ -178,7 +178,7 @@ void fillDrawing(DexData& data) {
   p1->setName(L"P1");
   p1->setCoords(5000.125, 2000.5, 101.25);
   auto* p2 = placed(new DexDesignPoint(), points, codes, L"TREE;Species=Oak");
-  p2->setName(L"P2");
+  p2->setName(L"P%%2");
   p2->setCoords(5010.0, 2003.0, kNoValue);
   auto* blue = new DexDrawPointProperties();
   blue->setColor(kBlue);
@@ -236,7 +236,7 @@ void fillDrawing(DexData& data) {
   dataset.add(circle);
   auto* label = placed(new DexTextLabel(), road, codes);
   label->setCoords(5080.0, 2080.0, 0.0);
-  label->setText(L"Station 1+00 \u00B1 {x}");
+  label->setText(L"Station 1+00 \u00B1 {x} 5%%");
   label->setHeightInMeters(2.5);
   label->setRotationAngle(30.0);
   label->setInsertionPoint(DexTextLabel::INSERT_MIDDLE_CENTER);
