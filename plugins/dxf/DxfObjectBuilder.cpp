@@ -310,11 +310,14 @@ DxfObjectBuilder::Extras DxfObjectBuilder::readExtras(DxfRecord& record) {
   return extras;
 }
 
+void DxfObjectBuilder::readCodes(std::wstring_view text, DexObject& object) {
+  if (!codes_.read(text, object)) report_.notHeld("code texts that are not a code list");
+}
+
 void DxfObjectBuilder::finishObject(DexObject* object, DxfRecord& record, const Extras& extras,
                                     const Style& style, int drawType) {
   if (!extras.name.empty()) object->setName(wide(extras.name));
-  if (!extras.codes.empty() && !codes_.read(decoder_.plain(extras.codes), *object))
-    report_.notHeld("code texts that are not a code list");
+  if (!extras.codes.empty()) readCodes(decoder_.plain(extras.codes), *object);
   object->setLayer(layerOf(record.text(group::kLayer)), false);
   applyStyle(*object, style, drawType);
   dataset_->add(object);
@@ -491,9 +494,8 @@ void DxfObjectBuilder::finishInsert() {
   }
   if (found[static_cast<int>(ERole::NAME)])
     point->setName(CVynStringT<wchar_t>(decoder_.text(values[static_cast<int>(ERole::NAME)])));
-  if (found[static_cast<int>(ERole::CODE)] &&
-      !codes_.read(decoder_.text(values[static_cast<int>(ERole::CODE)]), *point))
-    report_.notHeld("code texts that are not a code list");
+  if (found[static_cast<int>(ERole::CODE)])
+    readCodes(decoder_.text(values[static_cast<int>(ERole::CODE)]), *point);
   if (merged) {
     if (point->getNumberOfCodes() > 0 && point->getDrawProperties() == nullptr) {
       auto* properties = new DexDrawPointProperties();

@@ -128,6 +128,8 @@ class DxfObjectBuilder {
   void finishObject(DexObject* object, DxfRecord& record, const Extras& extras, const Style& style,
                     int drawType);
   Extras readExtras(DxfRecord& record);
+  // Adds the codes of a code text (the point files' syntax) to object; a malformed one is counted.
+  void readCodes(std::wstring_view text, DexObject& object);
   const DexLayer* layerOf(std::string_view name);
   // The drawing point at code (10, 11, ...) in world coordinates; ocs for an entity's own plane.
   bool pointAt(DxfRecord& record, int code, bool ocs, Vertex& vertex);
