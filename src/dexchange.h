@@ -80,6 +80,7 @@
 #include "ieUtils/IEAsciiFields.h"
 #include "ieUtils/IEAutoCADUtils.h"
 #include "ieUtils/IEFileReaders.h"
+#include "ieUtils/IELinework.h"
 #include "ieUtils/IELocalization.h"
 #include "ieUtils/IENaturalNames.h"
 #include "ieUtils/IEParsersLoader.h"

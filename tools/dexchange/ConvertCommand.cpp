@@ -7,6 +7,8 @@
 #include "RunReport.h"
 #include "ToolText.h"
 #include "ieObjects/IEData.h"
+#include "ieObjects/IEDataset.h"
+#include "ieUtils/IELinework.h"
 #include "ieUtils/IEUtilsUnitWords.h"
 
 namespace dexchange_tool {
@@ -34,7 +36,7 @@ class ConvertCommand final : public Command {
   std::string help() const override {
     return "usage: dexchange convert IN OUT [--from FORMAT] [--to FORMAT] [--types LIST]\n"
            "                        [--fields LIST | --order ORDER] [--delimiter C] [--units UNIT]\n"
-           "                        [--force] [--json]\n"
+           "                        [--linework] [--force] [--json]\n"
            "\n"
            "Imports IN into a data container through the plug-in of its format, then exports the\n"
            "container to OUT, each run in a worker thread (a progress bar on a terminal; Ctrl-C stops\n"
@@ -52,6 +54,9 @@ class ConvertCommand final : public Command {
     std::vector<Option> all = inputOptions();
     all.insert(all.begin() + 1,
                {"to", "FORMAT", "the format of OUT, as --from (default: the extension of OUT)"});
+    all.push_back({"linework", "",
+                   "join the points whose codes carry code strings (EP:1, KERB:L) into one\n"
+                   "polyline per code and string before the export, and export lines"});
     all.push_back(
         {"force", "", "overwrite OUT when it exists (on a terminal the tool asks; otherwise it\nrefuses)"});
     all.push_back(jsonOption());
@@ -74,6 +79,8 @@ class ConvertCommand final : public Command {
     vyn::ie::DexSettings settings;
     if (!makeSettings(arguments, *from->format(), true, settings, error))
       return fail(streams, kExitUsage, "convert: " + error);
+    const bool linework = arguments.has("linework");
+    if (linework) settings.addDataType(vyn::ie::LINES);
     if (!fileExists(report.input.file))
       return fail(streams, kExitFailure, "convert: " + report.input.file + " not found");
     if (!mayOverwrite(arguments, report.output.file, error))
@@ -83,12 +90,22 @@ class ConvertCommand final : public Command {
     loader.initIEData(settings);
     report.data = loader.getIEData();
     report.units = utf8(vyn::ie::utils::keywordFromDistUnits(settings.distUnits));
-    if (runSide(loader, report.input, false, report)) runSide(loader, report.output, true, report);
+    if (runSide(loader, report.input, false, report)) {
+      if (linework) report.lineworkPolylines = createLinework(*report.data);
+      runSide(loader, report.output, true, report);
+    }
     printSummary(streams, arguments.has("json"), report);
     return report.error.empty() ? kExitOk : fail(streams, report.exitCode, report.error);
   }
 
  private:
+  static int createLinework(vyn::ie::DexData& data) {
+    int polylines = 0;
+    for (int i = 0; i < data.getNumberOfDatasets(); ++i)
+      polylines += vyn::ie::utils::createLineworkFromCodes(*data.getDatasetAt(i));
+    return polylines;
+  }
+
   // One run with its notes; false (with the report's error) when it failed.
   static bool runSide(vyn::ie::DexParsersLoader& loader, RunSide& side, bool exportRun, RunReport& report) {
     side.finish(runInWorker(loader, exportRun, side.file, *side.format->format()));
@@ -106,6 +123,8 @@ class ConvertCommand final : public Command {
     if (json) {
       streams.out << jsonReport(report);
     } else if (report.error.empty()) {
+      if (report.lineworkPolylines >= 0)
+        streams.out << "linework: " << report.lineworkPolylines << " polylines from point codes\n";
       streams.out << "converted " << report.data->getNumberOfObjectsInAllDatasets() << " objects from "
                   << report.input.file << " (" << report.input.format->name() << ") to " << report.output.file
                   << " (" << report.output.format->name() << ")\n";

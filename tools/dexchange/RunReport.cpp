@@ -78,6 +78,13 @@ struct Summary {
           add(*object);
         }
       }
+      // Surfaces are held beside the objects, but a surveyor counts them with them.
+      const int surfaces = dataset.getNumberOfSurfaces();
+      if (surfaces > 0) {
+        own.objects += surfaces;
+        own.kinds[kindName(vyn::ie::OBJECT_TYPE_SURFACE)] += surfaces;
+        kinds[kindName(vyn::ie::OBJECT_TYPE_SURFACE)] += surfaces;
+      }
       datasets.push_back(own);
     }
   }
@@ -262,6 +269,7 @@ std::string jsonReport(const RunReport& report) {
   if (report.command == "convert") writeSide(json, "output", report.output, false);
   json.key("units").value(report.units);
   if (report.data != nullptr) writeContents(json, Summary(*report.data));
+  if (report.lineworkPolylines >= 0) json.key("linework").value(report.lineworkPolylines);
   json.key("exitCode").value(report.exitCode).key("error");
   if (report.error.empty()) {
     json.null();

@@ -35,6 +35,7 @@ struct RunReport {
   RunSide output;                    // convert only
   vyn::ie::DexData* data = nullptr;  // the loader's container after the runs
   std::string units;                 // the distance unit keyword of the run
+  int lineworkPolylines = -1;        // polylines made from point codes (convert --linework), -1 none asked
   int exitCode = kExitOk;
   std::string error;  // the failure line, empty on success
 };
