@@ -106,7 +106,8 @@ void appendEscaped(std::string& out, unsigned unit) {
 void appendCharacter(std::string& out, wchar_t ch) {
   const auto value = static_cast<std::uint32_t>(static_cast<char32_t>(ch));
   if (value < 0x20 || value == 0x7F) {
-    out += ' ';
+    // Escaped, not blanked: a blank separates the codes of a code text, so a blank would change it.
+    appendEscaped(out, value);
   } else if (value < 0x7F) {
     out += static_cast<char>(value);
   } else if (value > 0xFFFF && value <= 0x10FFFF) {

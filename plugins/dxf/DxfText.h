@@ -38,8 +38,8 @@ class DxfTextDecoder {
   std::wstring result_;
 };
 
-// Appends text as the bytes of a group value: ASCII as it is, every other character as "\U+XXXX",
-// control characters (line ends among them) as blanks.
+// Appends text as the bytes of a group value: printable ASCII as it is, every other character
+// (control characters and line ends among them) as "\U+XXXX", so that it reads back as itself.
 void appendEncoded(std::string& out, std::wstring_view text);
 // text for the value of TEXT or ATTRIB: each "%%" written so that it reads back as itself, not as a
 // control code.
