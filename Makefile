@@ -61,9 +61,7 @@ coverage: deps
 	cmake --build $(COVERAGE_DIR) -j$(JOBS)
 	find $(COVERAGE_DIR) -name '*.gcda' -delete
 	ctest --test-dir $(COVERAGE_DIR) --output-on-failure -j$(JOBS)
-	gcovr -r . -j$(JOBS) --object-directory $(COVERAGE_DIR) --filter 'src/' --filter 'plugins/' \
-		--filter 'tools/' --exclude-throw-branches --exclude-unreachable-branches \
-		--txt $(COVERAGE_DIR)/coverage.txt --json $(COVERAGE_DIR)/coverage.json --print-summary
+	scripts/coverage-report.sh $(COVERAGE_DIR) $(JOBS)
 
 # Sampled mutation testing (scripts/mutants.sh): make mutants SEED=1 N=40.
 SEED ?= 1
