@@ -123,6 +123,16 @@ TEST(Data, CurrentDatasetIsAStopgapMadeOnFirstUseOrNullWithARecordWhenConst) {
   DexData::stopProcess_ = false;
 }
 
+// A valid station-equation set of one equation; distinct aheads keep sets unequal.
+DexStaEquationSet* newSet(const wchar_t* name, double ahead) {
+  auto* const set = new DexStaEquationSet(name);
+  vyn::ie::DexStaEquation equation;
+  equation.setData(vyn::ie::DexStaEquation::RUNNING_CHAINAGE, 0.0);
+  equation.setData(vyn::ie::DexStaEquation::STATION_AHEAD, ahead);
+  set->addEquation(&equation);
+  return set;
+}
+
 // The held dictionaries as "codes templates parts sets layers localization", "-" for none.
 std::string dictionariesOf(const DexData& data) {
   std::string held;
@@ -180,12 +190,12 @@ TEST(Data, DictionaryEntriesOfAnExistingNameAreDeclinedAndLeftWithTheCaller) {
   auto* const fence = new DexCodeDescription(L"FENCE");
   auto* const crown = new DexRoadTemplate(L"crown");
   auto* const horizontal = new Part(IDexAlignmentPart::HORIZONTAL_ALIGNMENT, L"R1");
-  auto* const main = new DexStaEquationSet(L"main");
+  auto* const main = newSet(L"main", 1.0);
   DexCodeDescription fenceAgain(L"FENCE");
   DexRoadTemplate crownAgain(L"crown");
   Part partAgain(IDexAlignmentPart::HORIZONTAL_ALIGNMENT, L"R1");
   Part oddKind(7, L"odd");
-  DexStaEquationSet mainAgain(L"main");
+  const std::unique_ptr<DexStaEquationSet> mainAgain(newSet(L"main", 2.0));
   const dex_test::LogCapture log;
   // An entry held already is taken again; one of an existing name (and kind) is declined.
   EXPECT_TRUE(data.addCodeToIEDataDictionary(fence) && data.addCodeToIEDataDictionary(fence) &&
@@ -195,18 +205,19 @@ TEST(Data, DictionaryEntriesOfAnExistingNameAreDeclinedAndLeftWithTheCaller) {
               data.addIEAlignmentPartToDictionary(horizontal) &&
               data.addIEAlignmentPartToDictionary(new Part(IDexAlignmentPart::VERTICAL_ALIGNMENT, L"R1")) &&
               data.addIEStaEquationSetToDictionary(main) && data.addIEStaEquationSetToDictionary(main) &&
-              data.addIEStaEquationSetToDictionary(new DexStaEquationSet()) &&
-              data.addIEStaEquationSetToDictionary(new DexStaEquationSet()));
+              data.addIEStaEquationSetToDictionary(newSet(L"", 4.0)) &&
+              data.addIEStaEquationSetToDictionary(newSet(L"", 5.0)));
   EXPECT_FALSE(
       data.addCodeToIEDataDictionary(&fenceAgain) || data.addIERoadTemplateToDictionary(&crownAgain) ||
       data.addIEAlignmentPartToDictionary(&partAgain) || data.addIEAlignmentPartToDictionary(&oddKind) ||
-      data.addIEStaEquationSetToDictionary(&mainAgain));
+      data.addIEStaEquationSetToDictionary(mainAgain.get()));
   EXPECT_EQ(1, log.count(L"ieObjects\\IEAlignmentPartsDictionary", 802));
   EXPECT_EQ(fence, data.getIEDataDictionary()->findCodeDiscription(L"FENCE"));
   const DexRoadTemplatesDictionary* const templates = data.getIERoadTemplatesDictionary();
   EXPECT_FALSE(templates->areCentralOffsetsUsed() || templates->areAbsHeightsUsed());
   EXPECT_EQ(crown, templates->findRoadTemplate(L"crown"));
   EXPECT_EQ(3, data.getIEStaEquationSetDictionary()->getNumberOfElements());
+  EXPECT_EQ(main, data.getIEStaEquationSetDictionary()->findStaEquationSet(L"main"));
 }
 
 TEST(Data, LocalizationModeAndPointCodesNeedALocalization) {
@@ -454,7 +465,7 @@ TEST(Data, DestructionDeletesEveryKindOfMemberInItsFixedOrder) {
     data.getIEDrawDictionary()->addLayer(new DexLayer());
     data.addIERoadTemplateToDictionary(new DexRoadTemplate(L"crown"));
     data.addIEAlignmentPartToDictionary(new Part(IDexAlignmentPart::CROSS_SECTION_SET, L"X"));
-    data.addIEStaEquationSetToDictionary(new DexStaEquationSet(L"main"));
+    EXPECT_TRUE(data.addIEStaEquationSetToDictionary(newSet(L"main", 1.0)));
     data.addDLRun(new DexDLRun(L"R1", L""));
     data.addEquipment(1, DexRawDataEquipment());
     EXPECT_TRUE(deleted.empty());
