@@ -10,12 +10,14 @@
 #include "support/CommaLocale.h"
 #include "support/PrintString.h"
 #include "support/Rows.h"
+#include "support/SystemTime.h"
 #include "support/TimeZoneScope.h"
 
 namespace {
 
 using base::CTime;
 using base::CTimeSpan;
+using dex_test::systemTime;
 using Seconds = std::pair<__int64, __int64>;
 
 constexpr std::uint64_t kTicksPerSecond = 10'000'000;
@@ -36,19 +38,6 @@ std::uint64_t ticksOf(const FILETIME& time) {
 
 std::uint64_t ticksAt(__int64 seconds) {
   return kTicksAt1970 + static_cast<std::uint64_t>(seconds) * kTicksPerSecond;
-}
-
-SYSTEMTIME systemTime(int year, int month, int day, int hour = 0, int minute = 0, int second = 0,
-                      int ms = 0) {
-  SYSTEMTIME time{};
-  time.wYear = static_cast<WORD>(year);
-  time.wMonth = static_cast<WORD>(month);
-  time.wDay = static_cast<WORD>(day);
-  time.wHour = static_cast<WORD>(hour);
-  time.wMinute = static_cast<WORD>(minute);
-  time.wSecond = static_cast<WORD>(second);
-  time.wMilliseconds = static_cast<WORD>(ms);
-  return time;
 }
 
 // The fields as "Y-M-D h:m:s.ms dW".

@@ -16,6 +16,7 @@
 #include "ieObjects/IEPhotoNotes.h"
 #include "ieObjects/IETimeMS.h"
 #include "support/PrintString.h"
+#include "support/SystemTime.h"
 #include "support/TimeZoneScope.h"
 #include "support/VtableSlot.h"
 
@@ -23,6 +24,7 @@ namespace {
 
 using namespace vyn::ie;
 using base::CTime;
+using dex_test::systemTime;
 
 enum ESampleKind : int { FIRST = 0, SECOND = 1, THIRD = 2, FOURTH = 3 };
 
@@ -133,18 +135,6 @@ std::string timeOf(const DexTimeMS& time) {
   return std::to_string(time.GetTime()) + "." + std::to_string(time.getMS());
 }
 
-SYSTEMTIME systemTime(int year, int month, int day, int hour, int minute, int second) {
-  SYSTEMTIME result{};
-  result.wYear = static_cast<WORD>(year);
-  result.wMonth = static_cast<WORD>(month);
-  result.wDay = static_cast<WORD>(day);
-  result.wHour = static_cast<WORD>(hour);
-  result.wMinute = static_cast<WORD>(minute);
-  result.wSecond = static_cast<WORD>(second);
-  result.wMilliseconds = 999;  // ignored
-  return result;
-}
-
 TEST(DexTimeMS, ReadsCalendarFieldsAsLocalTimeWithTheDaylightSavingFlagAndKeepsTheMilliseconds) {
   EXPECT_EQ("0.0", timeOf(DexTimeMS()));
   EXPECT_EQ("1234567890.250", timeOf(DexTimeMS(1234567890, 250)));
@@ -152,18 +142,18 @@ TEST(DexTimeMS, ReadsCalendarFieldsAsLocalTimeWithTheDaylightSavingFlagAndKeepsT
   {
     const dex_test::TimeZoneScope utc("UTC0");
     EXPECT_EQ("1709296215.125", timeOf(DexTimeMS(2024, 3, 1, 12, 30, 15, 125, -1)));
-    EXPECT_EQ("1709296215.7", timeOf(DexTimeMS(systemTime(2024, 3, 1, 12, 30, 15), 7, 0)));
+    EXPECT_EQ("1709296215.7", timeOf(DexTimeMS(systemTime(2024, 3, 1, 12, 30, 15, 999), 7, 0)));
   }
   const dex_test::TimeZoneScope central(dex_test::kCentralEuropeanZone);
   EXPECT_EQ("1719828000.1", timeOf(DexTimeMS(2024, 7, 1, 12, 0, 0, 1, 1)));  // noon summer time
   EXPECT_EQ("1719828000.1", timeOf(DexTimeMS(2024, 7, 1, 12, 0, 0, 1, -1)));
   EXPECT_EQ("1719831600.1", timeOf(DexTimeMS(2024, 7, 1, 12, 0, 0, 1, 0)));
-  EXPECT_EQ("1719828000.5", timeOf(DexTimeMS(systemTime(2024, 7, 1, 12, 0, 0), 5, 1)));
-  EXPECT_EQ("1719831600.5", timeOf(DexTimeMS(systemTime(2024, 7, 1, 12, 0, 0), 5, 0)));
+  EXPECT_EQ("1719828000.5", timeOf(DexTimeMS(systemTime(2024, 7, 1, 12, 0, 0, 999), 5, 1)));
+  EXPECT_EQ("1719831600.5", timeOf(DexTimeMS(systemTime(2024, 7, 1, 12, 0, 0, 999), 5, 0)));
   for (const int dst : {-1, 0, 1})
     EXPECT_EQ(DexTimeMS(2024, 1, 15, 8, 5, 0, 0, dst).GetTime(), CTime(2024, 1, 15, 8, 5, 0, dst).GetTime());
   EXPECT_EQ("0.300", timeOf(DexTimeMS(2023, 2, 29, 0, 0, 0, 300, -1)));  // invalid fields: the empty time
-  EXPECT_EQ("0.300", timeOf(DexTimeMS(systemTime(2023, 13, 1, 0, 0, 0), 300, -1)));
+  EXPECT_EQ("0.300", timeOf(DexTimeMS(systemTime(2023, 13, 1, 0, 0, 0, 999), 300, -1)));
 }
 
 TEST(DexTimeMS, ComparesAndCountsWithTheMillisecondsCarriedAndBorrowedIntoZeroTo999) {
