@@ -33,9 +33,10 @@ count_lines() {
 
 total() { awk '{ sum += $1 } END { print sum + 0 }'; }
 
-tested=$(git ls-files 'src/*.cpp' 'src/*.h' 'plugins/*.cpp' 'plugins/*.h' 'tools/*.cpp' 'tools/*.h' |
+# --deduplicate: a file in conflict during a merge is listed once, not once per side.
+tested=$(git ls-files --deduplicate 'src/*.cpp' 'src/*.h' 'plugins/*.cpp' 'plugins/*.h' 'tools/*.cpp' 'tools/*.h' |
   count_lines | total)
-tests_per_file=$(git ls-files 'tests/*.cpp' 'tests/*.h' | count_lines)
+tests_per_file=$(git ls-files --deduplicate 'tests/*.cpp' 'tests/*.h' | count_lines)
 tests=$(total <<<"$tests_per_file")
 
 if [[ $verbose == -v ]]; then sort -rn <<<"$tests_per_file"; fi
