@@ -3,6 +3,8 @@ BUILD_DIR    ?= build
 SANITIZE_DIR ?= build-sanitize
 TSAN_DIR     ?= build-tsan
 FUZZ_DIR     ?= build-fuzz
+COVERAGE_DIR ?= build-coverage
+MUTANTS_DIR  ?= build-mutants
 PREFIX       ?= /usr/local
 JOBS         ?= 2
 FUZZ_SECONDS ?= 60
@@ -11,7 +13,8 @@ CMAKE_ARGS   ?=
 
 DEXCHANGE := $(BUILD_DIR)/tools/dexchange/dexchange
 
-.PHONY: all deps configure build demo test sanitize tsan install bench fuzz locale-test format tidy clean
+.PHONY: all deps configure build demo test sanitize tsan coverage mutants test-ratio install bench fuzz \
+	locale-test format tidy clean
 
 all: build
 
@@ -47,6 +50,29 @@ tsan: deps
 	TSAN_OPTIONS=halt_on_error=1:second_deadlock_stack=1 \
 		ctest --test-dir $(TSAN_DIR) --output-on-failure -j$(JOBS) -R '$(TSAN_TESTS)'
 
+# The suite built with gcc's coverage counters and run; gcovr sums up the lines and branches of the
+# library, the plug-ins and the tool (branches the compiler adds for exceptions are left out). The
+# report per file is in $(COVERAGE_DIR)/coverage.txt, the per-line data in coverage.json.
+COVERAGE_FLAGS := --coverage
+coverage: deps
+	cmake -S . -B $(COVERAGE_DIR) -DCMAKE_BUILD_TYPE=Debug -DCMAKE_CXX_FLAGS=$(COVERAGE_FLAGS) \
+		-DCMAKE_EXE_LINKER_FLAGS=$(COVERAGE_FLAGS) -DCMAKE_SHARED_LINKER_FLAGS=$(COVERAGE_FLAGS) \
+		-DCMAKE_MODULE_LINKER_FLAGS=$(COVERAGE_FLAGS) $(CMAKE_ARGS)
+	cmake --build $(COVERAGE_DIR) -j$(JOBS)
+	find $(COVERAGE_DIR) -name '*.gcda' -delete
+	ctest --test-dir $(COVERAGE_DIR) --output-on-failure -j$(JOBS)
+	scripts/coverage-report.sh $(COVERAGE_DIR) $(JOBS)
+
+# Sampled mutation testing (scripts/mutants.sh): make mutants SEED=1 N=40.
+SEED ?= 1
+N    ?= 40
+mutants: deps
+	scripts/mutants.sh $(SEED) $(N) $(MUTANTS_DIR)
+
+# Lines of tests/ against those of src/, plugins/ and tools/ (at most 40%).
+test-ratio:
+	@scripts/test-ratio.sh 40
+
 install: build
 	cmake --install $(BUILD_DIR) --prefix $(PREFIX)
 
@@ -73,4 +99,4 @@ tidy: configure
 	git ls-files 'src/*.cpp' 'tools/*.cpp' 'plugins/*.cpp' | xargs clang-tidy -p $(BUILD_DIR) --quiet
 
 clean:
-	rm -rf $(BUILD_DIR) $(SANITIZE_DIR) $(TSAN_DIR) $(FUZZ_DIR)
+	rm -rf $(BUILD_DIR) $(SANITIZE_DIR) $(TSAN_DIR) $(FUZZ_DIR) $(COVERAGE_DIR) $(MUTANTS_DIR)

@@ -14,49 +14,35 @@ bool writeText(base::CFile& file, std::string_view text) {
   return file.Write(text.data(), text.size());
 }
 
-TEST(CFile, WritesWhatReadsBack) {
+TEST(CFile, WritesWhatReadsBackTruncatesAndAppends) {
   const dex_test::TempDir dir;
-  const std::wstring path = dir.wfile("data.bin");
-  base::CFile file;
-  ASSERT_TRUE(file.OpenForWriting(path.c_str()));
-  EXPECT_TRUE(file.Opened());
+  const std::wstring path = dex_test::widen(dir.write("data.bin", "old content"));
   const std::string bytes(
       "\xFF\xFE"
       "a\0b\r\n",
       7);
+  base::CFile file;
+  ASSERT_TRUE(file.OpenForWriting(path.c_str()));
+  EXPECT_TRUE(file.Opened());
   EXPECT_TRUE(writeText(file, bytes));
   EXPECT_TRUE(file.Close());
   EXPECT_FALSE(file.Opened());
-  EXPECT_EQ(dex_test::readFile(dir.file("data.bin")), bytes);
-
+  ASSERT_TRUE(file.OpenForAppending(path.c_str()));
+  EXPECT_TRUE(writeText(file, "+more"));
+  file.Close();
   ASSERT_TRUE(file.OpenForReading(path.c_str()));
   char buffer[16] = {};
-  EXPECT_EQ(file.Read(buffer, sizeof buffer), bytes.size());
-  EXPECT_EQ(std::string(buffer, bytes.size()), bytes);
+  EXPECT_EQ(file.Read(buffer, sizeof buffer), bytes.size() + 5);
+  EXPECT_EQ(std::string(buffer, bytes.size() + 5), bytes + "+more");
   EXPECT_EQ(file.Read(buffer, sizeof buffer), 0u);
 }
 
-TEST(CFile, TruncatesOnWritingAndExtendsOnAppending) {
+TEST(CFile, CollectsManySmallWritesAndLargeOnesAndWritesTheRestWhenDestroyed) {
   const dex_test::TempDir dir;
-  const std::string path = dir.write("log.txt", "old content");
-  base::CFile file;
-  ASSERT_TRUE(file.OpenForWriting(dex_test::widen(path).c_str()));
-  EXPECT_TRUE(writeText(file, "new"));
-  file.Close();
-  EXPECT_EQ(dex_test::readFile(path), "new");
-  ASSERT_TRUE(file.OpenForAppending(dex_test::widen(path).c_str()));
-  EXPECT_TRUE(writeText(file, "+more"));
-  file.Close();
-  EXPECT_EQ(dex_test::readFile(path), "new+more");
-}
-
-TEST(CFile, CollectsManySmallWritesAndLargeOnes) {
-  const dex_test::TempDir dir;
-  const std::wstring path = dir.wfile("many.bin");
   std::string expected;
   {
     base::CFile file;
-    ASSERT_TRUE(file.OpenForWriting(path.c_str()));
+    ASSERT_TRUE(file.OpenForWriting(dir.wfile("many.bin").c_str()));
     for (int i = 0; i < 20000; ++i) {
       const std::string piece = std::to_string(i) + ';';
       ASSERT_TRUE(writeText(file, piece));
@@ -69,30 +55,23 @@ TEST(CFile, CollectsManySmallWritesAndLargeOnes) {
     EXPECT_EQ(dex_test::readFile(dir.file("many.bin")), expected);
     ASSERT_TRUE(writeText(file, "tail"));
     expected += "tail";
-  }  // the destructor writes what is left
+  }
   EXPECT_EQ(dex_test::readFile(dir.file("many.bin")), expected);
 }
 
-TEST(CFile, RefusesPathsItCannotOpen) {
-  const dex_test::TempDir dir;
-  base::CFile file;
-  EXPECT_FALSE(file.OpenForWriting(dir.wfile("missing-folder/out.txt").c_str()));
-  EXPECT_FALSE(file.OpenForAppending(dir.wfile("missing-folder/out.txt").c_str()));
-  EXPECT_FALSE(file.OpenForReading(dir.wfile("missing.txt").c_str()));
-  EXPECT_FALSE(file.OpenForReading(dir.wpath().c_str()));
-  EXPECT_FALSE(file.OpenForWriting(dir.wpath().c_str()));
-  EXPECT_FALSE(file.OpenForWriting(L""));
-  EXPECT_FALSE(file.OpenForWriting(nullptr));
-  EXPECT_FALSE(file.Opened());
-}
-
-TEST(CFile, AnswersFailureWhenClosedOrUsedTheWrongWay) {
+TEST(CFile, RefusesPathsItCannotOpenAndUsesTheWrongWay) {
   const dex_test::TempDir dir;
   base::CFile file;
   char buffer[4];
   EXPECT_EQ(file.Read(buffer, sizeof buffer), 0u);
   EXPECT_FALSE(writeText(file, "x"));
   EXPECT_TRUE(file.Close());
+  EXPECT_FALSE(file.OpenForWriting(dir.wfile("missing-folder/out.txt").c_str()));
+  EXPECT_FALSE(file.OpenForAppending(dir.wfile("missing-folder/out.txt").c_str()));
+  EXPECT_FALSE(file.OpenForReading(dir.wfile("missing.txt").c_str()));
+  EXPECT_FALSE(file.OpenForReading(dir.wpath().c_str()));
+  EXPECT_FALSE(file.OpenForWriting(dir.wpath().c_str()));
+  EXPECT_FALSE(file.OpenForWriting(L"") || file.OpenForWriting(nullptr) || file.Opened());
 
   const std::string path = dir.write("in.txt", "abc");
   ASSERT_TRUE(file.OpenForReading(dex_test::widen(path).c_str()));
@@ -100,53 +79,34 @@ TEST(CFile, AnswersFailureWhenClosedOrUsedTheWrongWay) {
   ASSERT_TRUE(file.OpenForWriting(dir.wfile("out.txt").c_str()));
   EXPECT_EQ(file.Read(buffer, sizeof buffer), 0u);
   EXPECT_EQ(dex_test::readFile(path), "abc");
-}
-
-TEST(CFile, ReportsAWriteTheSystemRefuses) {
-  base::CFile file;
+  // A write the system refuses shows when the collected bytes go out.
   ASSERT_TRUE(file.OpenForWriting(L"/dev/full"));
   EXPECT_TRUE(writeText(file, "collected"));
   EXPECT_FALSE(file.Close());
 }
 
-TEST(CFile, HandsItsFileOverWhenMoved) {
-  const dex_test::TempDir dir;
-  base::CFile first;
-  ASSERT_TRUE(first.OpenForWriting(dir.wfile("moved.txt").c_str()));
-  ASSERT_TRUE(writeText(first, "one"));
-  base::CFile second(std::move(first));
-  EXPECT_FALSE(first.Opened());  // NOLINT(bugprone-use-after-move): the moved-from state is defined
-  EXPECT_TRUE(second.Opened());
-  base::CFile third;
-  third = std::move(second);
-  ASSERT_TRUE(writeText(third, "two"));
-  EXPECT_TRUE(third.Close());
-  EXPECT_EQ(dex_test::readFile(dir.file("moved.txt")), "onetwo");
-}
-
-TEST(CFile, ClosesItsFileWhenReopenedClosedOrDestroyed) {
+TEST(CFile, HandsItsFileOverWhenMovedAndClosesItOnEveryPath) {
   const dex_test::TempDir dir;
   const int before = dex_test::openFileDescriptors();
   {
-    base::CFile file;
-    file.OpenForWriting(dir.wfile("a.txt").c_str());
-    file.OpenForAppending(dir.wfile("a.txt").c_str());
-    file.OpenForReading(dir.wfile("missing.txt").c_str());
+    base::CFile first;
+    ASSERT_TRUE(first.OpenForWriting(dir.wpath().append(L"/Größe 東京.txt").c_str()));
+    ASSERT_TRUE(writeText(first, "one"));
+    base::CFile second(std::move(first));
+    EXPECT_FALSE(first.Opened());  // NOLINT(bugprone-use-after-move): the moved-from state is defined
+    base::CFile third;
+    third = std::move(second);
+    ASSERT_TRUE(writeText(third, "two"));
+    EXPECT_TRUE(third.Close());
+    third.OpenForWriting(dir.wfile("a.txt").c_str());
+    third.OpenForAppending(dir.wfile("a.txt").c_str());
+    third.OpenForReading(dir.wfile("missing.txt").c_str());
     EXPECT_EQ(dex_test::openFileDescriptors(), before);
-    file.OpenForReading(dir.wfile("a.txt").c_str());
+    third.OpenForReading(dir.wfile("a.txt").c_str());
     EXPECT_EQ(dex_test::openFileDescriptors(), before + 1);
   }
   EXPECT_EQ(dex_test::openFileDescriptors(), before);
-}
-
-TEST(CFile, OpensNamesWithNonAsciiCharacters) {
-  const dex_test::TempDir dir;
-  const std::wstring path = dir.wpath() + L"/Größe 東京.txt";
-  base::CFile file;
-  ASSERT_TRUE(file.OpenForWriting(path.c_str()));
-  EXPECT_TRUE(writeText(file, "x"));
-  file.Close();
-  EXPECT_EQ(dex_test::readFile(dir.file("Größe 東京.txt")), "x");
+  EXPECT_EQ(dex_test::readFile(dir.file("Größe 東京.txt")), "onetwo");
 }
 
 }  // namespace

@@ -63,46 +63,25 @@ class VynLibrary : public ::testing::Test {
 
 }  // namespace
 
-// Finding a library.
-
-TEST_F(VynLibrary, FindsBareNameInThePluginPath) {
+TEST_F(VynLibrary, FindsBareNamesInEveryPluginFolderInOrderFileNamesAndPaths) {
   EntryPoint makeImporter = nullptr;
   const LibraryResult result = GetLibraryFunction(module_, makeImporter, L"DexTestHello", "MakeImporter");
   ASSERT_TRUE(result) << vyn_text::toUtf8(result.errorText().view());
-  EXPECT_NE(module_, nullptr);
-  ASSERT_NE(makeImporter, nullptr);
-  EXPECT_EQ(makeImporter(), kImporterMagic);
-  EXPECT_TRUE(result.errorText().IsEmpty());
-}
-
-TEST_F(VynLibrary, SearchesEveryFolderOfThePluginPathInOrder) {
+  ASSERT_TRUE(module_ != nullptr && makeImporter != nullptr);
+  EXPECT_TRUE(makeImporter() == kImporterMagic && result.errorText().IsEmpty());
   setPluginPath("/nonexistent/dexchange::" + kPluginDir + ":");
   EntryPoint makeExporter = nullptr;
-  EXPECT_TRUE(GetLibraryFunction(module_, makeExporter, L"DexTestHello", "MakeExporter"));
-  ASSERT_NE(makeExporter, nullptr);
-  EXPECT_EQ(makeExporter(), kExporterMagic);
-}
-
-TEST_F(VynLibrary, TakesANameEndingInSoAsTheFileName) {
-  EntryPoint makeImporter = nullptr;
-  EXPECT_TRUE(GetLibraryFunction(module_, makeImporter, L"libDexTestHello.so", "MakeImporter"));
-  EXPECT_NE(makeImporter, nullptr);
-}
-
-TEST_F(VynLibrary, OpensANameWithASlashAsAPath) {
-  clearPluginPath();
-  EntryPoint makeExporter = nullptr;
-  EXPECT_TRUE(GetLibraryFunction(module_, makeExporter, dex_test::widen(kHelloPath).c_str(), "MakeExporter"));
-  ASSERT_NE(makeExporter, nullptr);
-  EXPECT_EQ(makeExporter(), kExporterMagic);
-}
-
-TEST_F(VynLibrary, BareNameOutsideTheSearchFoldersIsNotFound) {
-  clearPluginPath();
-  EntryPoint makeImporter = staleEntryPoint();
+  ASSERT_TRUE(GetLibraryFunction(module_, makeExporter, L"DexTestHello", "MakeExporter"));
+  EXPECT_EQ(kExporterMagic, makeExporter());
+  EXPECT_TRUE(
+      GetLibraryFunction(module_, makeImporter, L"libDexTestHello.so", "MakeImporter"));  // a file name
+  clearPluginPath();  // a name with a slash is a path
+  makeExporter = nullptr;
+  ASSERT_TRUE(GetLibraryFunction(module_, makeExporter, dex_test::widen(kHelloPath).c_str(), "MakeExporter"));
+  EXPECT_EQ(kExporterMagic, makeExporter());
+  makeImporter = staleEntryPoint();  // a bare name outside the search folders is not found
   EXPECT_FALSE(GetLibraryFunction(module_, makeImporter, L"DexTestHello", "MakeImporter"));
-  EXPECT_EQ(module_, nullptr);
-  EXPECT_EQ(makeImporter, nullptr);
+  EXPECT_TRUE(module_ == nullptr && makeImporter == nullptr);
 }
 
 TEST_F(VynLibrary, PluginLogsReachTheHostsSink) {
@@ -110,114 +89,59 @@ TEST_F(VynLibrary, PluginLogsReachTheHostsSink) {
   ASSERT_TRUE(GetLibraryFunction(module_, logHello, L"DexTestHello", "DexTestHelloLog"));
   const dex_test::LogCapture capture;
   logHello(7);
-  EXPECT_EQ(capture.count(L"tests\\DexTestHello", 7), 1);
+  EXPECT_EQ(1, capture.count(L"tests\\DexTestHello", 7));
 }
 
-// Failures.
-
-TEST_F(VynLibrary, MissingLibraryAnswersFalseAndClearsBothOutputs) {
-  EntryPoint makeImporter = staleEntryPoint();
-  const LibraryResult result = GetLibraryFunction(module_, makeImporter, L"DexNoSuchPlugin", "MakeImporter");
-  EXPECT_FALSE(result);
-  EXPECT_EQ(module_, nullptr);
-  EXPECT_EQ(makeImporter, nullptr);
-  EXPECT_NE(result.errorText().Find(L"libDexNoSuchPlugin.so"), -1);
-}
-
-TEST_F(VynLibrary, MissingPathAnswersFalse) {
-  EntryPoint makeImporter = staleEntryPoint();
-  EXPECT_FALSE(GetLibraryFunction(module_, makeImporter, L"/nonexistent/libDexTestHello.so", "MakeImporter"));
-  EXPECT_EQ(module_, nullptr);
-  EXPECT_EQ(makeImporter, nullptr);
-}
-
-TEST_F(VynLibrary, MissingEntryPointAnswersFalseAndReleasesTheLibrary) {
+TEST_F(VynLibrary, FailuresAnswerFalseWithAReasonClearBothOutputsAndReleaseTheLibrary) {
+  const dex_test::TempDir folder;
+  const std::string broken = folder.write("libDexBroken.so", "not a shared object");
   ASSERT_FALSE(isResident(kNoEntryPointsPath));
-  EntryPoint makeImporter = staleEntryPoint();
-  const LibraryResult result =
-      GetLibraryFunction(module_, makeImporter, L"DexTestNoEntryPoints", "MakeImporter");
-  EXPECT_FALSE(result);
-  EXPECT_EQ(module_, nullptr);
-  EXPECT_EQ(makeImporter, nullptr);
-  EXPECT_NE(result.errorText().Find(L"MakeImporter"), -1);
+  const struct {
+    const wchar_t* library;
+    const char* function;
+    std::wstring reason;
+  } rows[] = {{L"DexNoSuchPlugin", "MakeImporter", L"libDexNoSuchPlugin.so"},
+              {L"/nonexistent/libDexTestHello.so", "MakeImporter", L""},
+              {L"DexTestNoEntryPoints", "MakeImporter", L"MakeImporter"},
+              {L"DexBroken", "MakeImporter", dex_test::widen(broken)},  // a file that is no library
+              {nullptr, "MakeImporter", L""},
+              {L"", "MakeImporter", L""},
+              {L"DexTestHello", nullptr, L""},
+              {L"DexTestHello", "", L""}};
+  setPluginPath(kPluginDir + ":" + folder.path());
+  for (const auto& row : rows) {
+    EntryPoint makeImporter = staleEntryPoint();
+    const LibraryResult result = GetLibraryFunction(module_, makeImporter, row.library, row.function);
+    EXPECT_FALSE(result) << row.reason;
+    EXPECT_TRUE(module_ == nullptr && makeImporter == nullptr) << row.reason;
+    EXPECT_NE(-1, result.errorText().Find(row.reason.c_str())) << vyn_text::toUtf8(result.errorText().view());
+  }
   EXPECT_FALSE(isResident(kNoEntryPointsPath));
 }
 
-TEST_F(VynLibrary, FileInAPluginFolderThatIsNoLibraryReportsItsOwnError) {
-  const dex_test::TempDir folder;
-  const std::string broken = folder.write("libDexBroken.so", "not a shared object");
-  setPluginPath(folder.path());
-  EntryPoint makeImporter = staleEntryPoint();
-  const LibraryResult result = GetLibraryFunction(module_, makeImporter, L"DexBroken", "MakeImporter");
-  EXPECT_FALSE(result);
-  EXPECT_EQ(module_, nullptr);
-  EXPECT_EQ(makeImporter, nullptr);
-  EXPECT_NE(result.errorText().Find(dex_test::widen(broken).c_str()), -1);
-}
-
-TEST_F(VynLibrary, MissingNamesAnswerFalseWithAReason) {
-  EntryPoint makeImporter = staleEntryPoint();
-  const LibraryResult noLibrary = GetLibraryFunction(module_, makeImporter, nullptr, "MakeImporter");
-  EXPECT_FALSE(noLibrary);
-  EXPECT_FALSE(noLibrary.errorText().IsEmpty());
-  EXPECT_EQ(makeImporter, nullptr);
-
-  EXPECT_FALSE(GetLibraryFunction(module_, makeImporter, L"", "MakeImporter"));
-  const LibraryResult noFunction = GetLibraryFunction(module_, makeImporter, L"DexTestHello", nullptr);
-  EXPECT_FALSE(noFunction);
-  EXPECT_FALSE(noFunction.errorText().IsEmpty());
-  EXPECT_FALSE(GetLibraryFunction(module_, makeImporter, L"DexTestHello", ""));
-  EXPECT_EQ(module_, nullptr);
-}
-
-// The handle.
-
-TEST_F(VynLibrary, HandleSetOnEntryIsReleasedBeforeTheNextLoad) {
+TEST_F(VynLibrary, AHandleSetOnEntryIsReleasedBeforeTheNextLoadAndByFree) {
   EntryPoint makeImporter = nullptr;
   ASSERT_TRUE(GetLibraryFunction(module_, makeImporter, dex_test::widen(kHelloPath).c_str(), "MakeImporter"));
   ASSERT_TRUE(isResident(kHelloPath));
-
   AnswerEntryPoint answer = nullptr;
   ASSERT_TRUE(GetLibraryFunction(module_, answer, L"DexTestNoEntryPoints", "DexTestNoEntryPointsAnswer"));
-  EXPECT_EQ(answer(), 42);
-  EXPECT_FALSE(isResident(kHelloPath));
-  EXPECT_TRUE(isResident(kNoEntryPointsPath));
-}
-
-TEST_F(VynLibrary, HandleSetOnEntryIsReleasedAlsoWhenTheLoadFails) {
-  EntryPoint makeImporter = nullptr;
+  EXPECT_EQ(42, answer());
+  EXPECT_TRUE(!isResident(kHelloPath) && isResident(kNoEntryPointsPath));
   ASSERT_TRUE(GetLibraryFunction(module_, makeImporter, L"DexTestHello", "MakeImporter"));
-  EXPECT_FALSE(GetLibraryFunction(module_, makeImporter, L"DexNoSuchPlugin", "MakeImporter"));
-  EXPECT_EQ(module_, nullptr);
-  EXPECT_FALSE(isResident(kHelloPath));
-}
-
-TEST_F(VynLibrary, FreeReleasesTheLibraryAndClearsTheHandle) {
-  EntryPoint makeImporter = nullptr;
+  EXPECT_FALSE(
+      GetLibraryFunction(module_, makeImporter, L"DexNoSuchPlugin", "MakeImporter"));  // also on failure
+  EXPECT_TRUE(module_ == nullptr && !isResident(kHelloPath));
   ASSERT_TRUE(GetLibraryFunction(module_, makeImporter, L"DexTestHello", "MakeImporter"));
-  FreeLibraryFunction(module_);
-  EXPECT_EQ(module_, nullptr);
-  EXPECT_FALSE(isResident(kHelloPath));
-}
-
-TEST_F(VynLibrary, FreeOfANullHandleIsHarmless) {
-  HINSTANCE module = nullptr;
-  FreeLibraryFunction(module);
-  FreeLibraryFunction(module);
-  EXPECT_EQ(module, nullptr);
-}
-
-TEST_F(VynLibrary, TwoHandlesOfOneLibraryAreReleasedIndependently) {
-  HINSTANCE other = nullptr;
-  EntryPoint makeImporter = nullptr;
+  HINSTANCE other = nullptr;  // two handles of one library are released independently
   EntryPoint makeExporter = nullptr;
-  ASSERT_TRUE(GetLibraryFunction(module_, makeImporter, L"DexTestHello", "MakeImporter"));
   ASSERT_TRUE(GetLibraryFunction(other, makeExporter, L"DexTestHello", "MakeExporter"));
   FreeLibraryFunction(other);
-  EXPECT_EQ(makeImporter(), kImporterMagic);  // still held through module_
+  EXPECT_EQ(kImporterMagic, makeImporter());  // still held through module_
+  FreeLibraryFunction(module_);
+  EXPECT_TRUE(module_ == nullptr && !isResident(kHelloPath));
+  FreeLibraryFunction(module_);  // harmless on a null handle
+  EXPECT_EQ(nullptr, module_);
 }
-
-// The test seam.
 
 TEST_F(VynLibrary, CountsEveryCallAndEverySuccessfulLoad) {
   const unsigned calls = vyn::plugins::loadCallCountForTesting();
@@ -226,6 +150,6 @@ TEST_F(VynLibrary, CountsEveryCallAndEverySuccessfulLoad) {
   EXPECT_TRUE(GetLibraryFunction(module_, makeImporter, L"DexTestHello", "MakeImporter"));
   EXPECT_FALSE(GetLibraryFunction(module_, makeImporter, L"DexNoSuchPlugin", "MakeImporter"));
   EXPECT_FALSE(GetLibraryFunction(module_, makeImporter, L"DexTestNoEntryPoints", "MakeImporter"));
-  EXPECT_EQ(vyn::plugins::loadCallCountForTesting(), calls + 3);
-  EXPECT_EQ(vyn::plugins::successfulLoadCountForTesting(), loads + 1);
+  EXPECT_EQ(calls + 3, vyn::plugins::loadCallCountForTesting());
+  EXPECT_EQ(loads + 1, vyn::plugins::successfulLoadCountForTesting());
 }

@@ -2,15 +2,17 @@
 
 #include <gtest/gtest.h>
 
+#include <initializer_list>
+#include <utility>
+
 #include "ieObjects/IENoValue.h"
 #include "ieObjects/IEStation.h"
+#include "support/PrintString.h"
 
 namespace {
 
-using vyn::ie::DexDatasetProperties;
-using vyn::ie::DexPosition3D;
-using vyn::ie::DexStation;
-using vyn::ie::cs_utils::DexCoordinateSystemInfo;
+using namespace vyn::ie;
+using cs_utils::DexCoordinateSystemInfo;
 
 DexStation stationAt(double x, double y, double z) {
   DexStation station;
@@ -26,145 +28,81 @@ DexDatasetProperties extentOf(double minX, double minY, double maxX, double maxY
   return properties;
 }
 
-TEST(DexDatasetProperties, NewPropertiesHaveNoExtent) {
-  const DexDatasetProperties properties;
-  EXPECT_FALSE(properties.isMinMaxDefined());
-  EXPECT_EQ(DexPosition3D(0, 0, 0), properties.getBorder(DexDatasetProperties::MIN_BORDER));
-  EXPECT_EQ(DexPosition3D(0, 0, 0), properties.getBorder(DexDatasetProperties::MAX_BORDER));
-  EXPECT_EQ(0, properties.getExtraValue(0));
-}
-
-TEST(DexDatasetProperties, FirstStationSetsBothBordersAndLaterOnesWidenThem) {
+TEST(DexDatasetProperties, TheFirstStationWithHorizontalCoordinatesSetsTheBordersAndLaterOnesWidenThem) {
   DexDatasetProperties properties;
+  EXPECT_FALSE(properties.isMinMaxDefined());
+  properties.updateBorders(stationAt(kNoValue, 20, 30));
+  EXPECT_FALSE(properties.isMinMaxDefined());
   properties.updateBorders(stationAt(10, 20, 30));
   EXPECT_TRUE(properties.isMinMaxDefined());
-  EXPECT_EQ(DexPosition3D(10, 20, 30), properties.getBorder(0));
-  EXPECT_EQ(DexPosition3D(10, 20, 30), properties.getBorder(1));
-
-  properties.updateBorders(stationAt(5, 25, 30));
-  properties.updateBorders(stationAt(12, 22, -4));
+  EXPECT_EQ(DexPosition3D(10, 20, 30), properties.getBorder(DexDatasetProperties::MIN_BORDER));
+  DexStation undefinedHeight = stationAt(12, 22, -4);  // the height counts even when not defined
+  undefinedHeight.setHeightUndefined();
+  for (const DexStation& station : {stationAt(5, 25, 30), undefinedHeight, stationAt(kNoValue, 100, 100)})
+    properties.updateBorders(station);
   EXPECT_EQ(DexPosition3D(5, 20, -4), properties.getBorder(0));
-  EXPECT_EQ(DexPosition3D(12, 25, 30), properties.getBorder(1));
-}
-
-TEST(DexDatasetProperties, StationsWithoutHorizontalCoordinatesChangeNothing) {
-  DexDatasetProperties properties;
-  properties.updateBorders(stationAt(vyn::ie::kNoValue, 20, 30));
-  EXPECT_FALSE(properties.isMinMaxDefined());
-  properties.updateBorders(stationAt(1, 1, 1));
-  properties.updateBorders(stationAt(vyn::ie::kNoValue, 100, 100));
-  EXPECT_EQ(DexPosition3D(1, 1, 1), properties.getBorder(1));
-}
-
-TEST(DexDatasetProperties, HeightCountsEvenWhenNotDefined) {
-  DexDatasetProperties properties;
-  DexStation station = stationAt(1, 1, 50);
-  station.setHeightUndefined();
-  properties.updateBorders(stationAt(0, 0, 0));
-  properties.updateBorders(station);
-  EXPECT_EQ(50.0, properties.getBorder(DexDatasetProperties::MAX_BORDER).z);
-}
-
-TEST(DexDatasetProperties, ResetForgetsTheExtentButKeepsTheBorders) {
-  DexDatasetProperties properties = extentOf(0, 0, 10, 10);
+  EXPECT_EQ(DexPosition3D(12, 25, 30), properties.getBorder(DexDatasetProperties::MAX_BORDER));
+  EXPECT_TRUE(properties.getBorder(2) == DexPosition3D() && properties.getBorder(-1) == DexPosition3D());
   properties.setExtraValue(2, 7);
-  properties.reset();
+  properties.setExtraValue(3, 9);  // outside: ignored
+  EXPECT_TRUE(properties.getExtraValue(2) == 7 && properties.getExtraValue(3) == 0);
+  DexDatasetProperties target;
+  target.clone(properties);
+  EXPECT_TRUE(target.isMinMaxDefined() && target.getBorder(1) == DexPosition3D(12, 25, 30) &&
+              target.getExtraValue(2) == 7);
+  properties.reset();  // forgets the extent, keeps the borders until the next station
   EXPECT_FALSE(properties.isMinMaxDefined());
   EXPECT_EQ(0, properties.getExtraValue(2));
-  EXPECT_EQ(DexPosition3D(10, 10, 0), properties.getBorder(1));
-
-  // The next station starts a new extent.
+  EXPECT_EQ(DexPosition3D(12, 25, 30), properties.getBorder(1));
   properties.updateBorders(stationAt(3, 3, 3));
   EXPECT_EQ(DexPosition3D(3, 3, 3), properties.getBorder(0));
 }
 
-TEST(DexDatasetProperties, CloneTakesEveryValue) {
-  DexDatasetProperties source = extentOf(0, 0, 10, 20);
-  source.setExtraValue(0, 5);
-  DexDatasetProperties target;
-  target.clone(source);
-  EXPECT_TRUE(target.isMinMaxDefined());
-  EXPECT_EQ(DexPosition3D(10, 20, 0), target.getBorder(1));
-  EXPECT_EQ(5, target.getExtraValue(0));
-}
-
-TEST(DexDatasetProperties, KindsAndIndexesOutsideTheirRangeReadAsNeutral) {
-  DexDatasetProperties properties = extentOf(1, 1, 2, 2);
-  EXPECT_EQ(DexPosition3D(0, 0, 0), properties.getBorder(2));
-  EXPECT_EQ(DexPosition3D(0, 0, 0), properties.getBorder(-1));
-  properties.setExtraValue(3, 9);
-  EXPECT_EQ(0, properties.getExtraValue(3));
-}
-
-TEST(DexDatasetProperties, TextSizeFollowsTheLargestExtentUpToItsMaximum) {
+TEST(DexDatasetProperties, TextSymbolAndDashSizesFollowTheLargestExtentLeavingOutFarBorders) {
   EXPECT_DOUBLE_EQ(0.2, DexDatasetProperties().calcAutoTextSize());
-  EXPECT_DOUBLE_EQ(1.0, extentOf(0, 0, 1000, 400).calcAutoTextSize());
-  EXPECT_DOUBLE_EQ(1.0, extentOf(0, 0, 400, 1000).calcAutoTextSize());
-  EXPECT_DOUBLE_EQ(1.5, extentOf(0, 0, 1500, 10).calcAutoTextSize());
-  EXPECT_DOUBLE_EQ(1.5, extentOf(0, 0, 90000, 10).calcAutoTextSize());
-  EXPECT_DOUBLE_EQ(0.0, extentOf(5, 5, 5, 5).calcAutoTextSize());
-}
-
-TEST(DexDatasetProperties, SymbolSizeIsLeftAloneWithoutAnExtent) {
+  for (const auto& [properties, size] : std::initializer_list<std::pair<DexDatasetProperties, double>>{
+           {extentOf(0, 0, 1000, 400), 1.0},
+           {extentOf(0, 0, 400, 1000), 1.0},
+           {extentOf(0, 0, 1500, 10), 1.5},
+           {extentOf(0, 0, 90000, 10), 1.5},
+           {extentOf(5, 5, 5, 5), 0.0},
+           {extentOf(-1e11, -1e11, 1e11, 1e11), 0.0}})
+    EXPECT_DOUBLE_EQ(size, properties.calcAutoTextSize());
   double size = -7.0;
-  DexDatasetProperties().calcAutoSymbolSize(size);
+  DexDatasetProperties().calcAutoSymbolSize(size);  // left alone without an extent
   EXPECT_EQ(-7.0, size);
   extentOf(0, 0, 1000, 200).calcAutoSymbolSize(size);
   EXPECT_DOUBLE_EQ(15.0, size);
-}
-
-TEST(DexDatasetProperties, DashSizesFollowTheExtentUpToOne) {
+  extentOf(-1e10, 0, 100, 200).calcAutoSymbolSize(size);  // a far x border: only the y extent counts
+  EXPECT_DOUBLE_EQ(200 * 0.015, size);
+  extentOf(0, 0, 100, 2e10).calcAutoSymbolSize(size);
+  EXPECT_DOUBLE_EQ(100 * 0.015, size);
+  extentOf(0, -3e10, 100, 5000).calcAutoSymbolSize(size);
+  EXPECT_DOUBLE_EQ(100 * 0.015, size);
   double dash = -1.0;
   double second = -1.0;
   double third = -1.0;
   DexDatasetProperties().calcAutoDashSize(dash, second, third);
-  EXPECT_EQ(-1.0, dash);
-  EXPECT_EQ(-1.0, second);
-  EXPECT_EQ(-1.0, third);
-
+  EXPECT_TRUE(dash == -1.0 && second == -1.0 && third == -1.0);
   extentOf(0, 0, 10, 6).calcAutoDashSize(dash, second, third);
   EXPECT_DOUBLE_EQ(0.5, dash);
   EXPECT_DOUBLE_EQ(1.0 / 3.0, second);
   EXPECT_DOUBLE_EQ(-0.5 / 3.0, third);
-
-  extentOf(0, 0, 1000, 6).calcAutoDashSize(dash, second, third);
+  extentOf(0, 0, 1000, 6).calcAutoDashSize(dash, second, third);  // up to one
   EXPECT_DOUBLE_EQ(1.0, dash);
-  EXPECT_DOUBLE_EQ(2.0 / 3.0, second);
   EXPECT_DOUBLE_EQ(-1.0 / 3.0, third);
 }
 
-TEST(DexDatasetProperties, FarBordersTakeNoPartInTheWidth) {
-  double size = 0.0;
-  // A far x border: only the y extent counts.
-  extentOf(-1e10, 0, 100, 200).calcAutoSymbolSize(size);
-  EXPECT_DOUBLE_EQ(200 * 0.015, size);
-  // A far maximum y border: only the x extent counts.
-  extentOf(0, 0, 100, 2e10).calcAutoSymbolSize(size);
-  EXPECT_DOUBLE_EQ(100 * 0.015, size);
-  // A far minimum y border: only the x extent counts.
-  extentOf(0, -3e10, 100, 5000).calcAutoSymbolSize(size);
-  EXPECT_DOUBLE_EQ(100 * 0.015, size);
-  // Far borders everywhere: width 0.
-  EXPECT_DOUBLE_EQ(0.0, extentOf(-1e11, -1e11, 1e11, 1e11).calcAutoTextSize());
-}
-
-TEST(DexCoordinateSystemInfo, NewRecordIsKindFourWithEmptyTexts) {
-  const DexCoordinateSystemInfo info;
-  EXPECT_EQ(4, info.kind);
+TEST(DexCoordinateSystemInfo, IsKindFourWithEmptyTextsAndCopiesEveryMember) {
+  DexCoordinateSystemInfo info;
+  EXPECT_TRUE(info.kind == 4 && info.value == 0);
   for (const auto& text : info.texts)
     EXPECT_TRUE(text.IsEmpty());
-  EXPECT_EQ(0, info.value);
-}
-
-TEST(DexCoordinateSystemInfo, CopiesEveryMember) {
-  DexCoordinateSystemInfo info;
   info.kind = DexCoordinateSystemInfo::kGeographicKind;
   info.texts[4] = L"WGS 84";
   info.value = 12345;
   const DexCoordinateSystemInfo copy = info;
-  EXPECT_EQ(1, copy.kind);
-  EXPECT_EQ(L"WGS 84", copy.texts[4]);
-  EXPECT_EQ(12345, copy.value);
+  EXPECT_TRUE(copy.kind == 1 && copy.texts[4] == L"WGS 84" && copy.value == 12345);
 }
 
 }  // namespace

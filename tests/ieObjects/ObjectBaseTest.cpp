@@ -1,3 +1,4 @@
+// The common part of the survey objects, and the small kinds: text labels, parcels and regions.
 #include "ieObjects/IEObjectBase.h"
 
 #include <gtest/gtest.h>
@@ -7,93 +8,32 @@
 #include <utility>
 
 #include "ObjectsTestHelpers.h"
+#include "ieObjects/IEHorizontalAlignment.h"
 #include "ieObjects/IELayers.h"
 #include "ieObjects/IEObjects.h"
+#include "ieObjects/IEParcel.h"
+#include "ieObjects/IERegion.h"
 #include "ieObjects/detail/ObjectsLog.h"
+#include "ieObjects/detail/ParcelLog.h"
+#include "ieObjects/detail/RegionLog.h"
 #include "support/LogCapture.h"
 #include "support/PrintString.h"
 #include "support/VtableSlot.h"
 
 namespace {
 
-using objects_test::codeOf;
-using objects_test::colorOf;
-using objects_test::CountedLineProperties;
-using objects_test::CountedPhotoNotes;
-using objects_test::firstPhotoFileOf;
-using objects_test::linePropertiesOf;
-using objects_test::photoNotesOf;
-using vyn::ie::DexArc;
-using vyn::ie::DexArea;
-using vyn::ie::DexBreakline;
-using vyn::ie::DexCircle;
-using vyn::ie::DexCodeDescription;
-using vyn::ie::DexDesignPoint;
-using vyn::ie::DexDrawLineProperties;
-using vyn::ie::DexDrawPointProperties;
-using vyn::ie::DexLayer;
-using vyn::ie::DexObject;
-using vyn::ie::DexPolyLine;
-using vyn::ie::DexPtlPoint;
-using vyn::ie::DexSheetPoint;
-using vyn::ie::DexTextLabel;
-using vyn::ie::IDexDrawProperties;
-using vyn::ie::IDexStateInterface;
+using namespace vyn::ie;
+using namespace objects_test;
 namespace detail = vyn::ie::detail;
-
-const std::wstring kSource = detail::kObjectsLogSource;
 
 // A design point whose protected copy of the common part the tests may call.
 class ExposedPoint : public DexDesignPoint {
  public:
   using DexDesignPoint::copyCommonData;
+  static auto copyCommonDataSlot() { return dex_test::vtableEntryOf(&ExposedPoint::copyCommonData); }
 };
 
-// A layer with line properties of the given colour.
-std::unique_ptr<DexLayer> layerWithLineColor(unsigned long color) {
-  auto layer = std::make_unique<DexLayer>();
-  layer->setDrawProperties(IDexDrawProperties::DRAW_LINE, linePropertiesOf(color));
-  return layer;
-}
-
-}  // namespace
-
-static_assert(sizeof(DexObject::EGroupType) == 4);
-static_assert(DexObject::GROUP_POINTS == 0 && DexObject::GROUP_SHEET_POINTS == 1 &&
-              DexObject::GROUP_LINES == 2);
-
-// ---- Common state -------------------------------------------------------------------------------
-
-TEST(DexObject, StartsActiveWithoutLayerPhotoNotesOrCodes) {
-  DexDesignPoint point;
-  EXPECT_EQ(1, point.getStateType());
-  EXPECT_EQ(nullptr, point.getLayer());
-  EXPECT_FALSE(point.isLayerByCode());
-  EXPECT_EQ(nullptr, point.getPhotoNotes());
-  EXPECT_EQ(0, point.getNumberOfCodes());
-  EXPECT_EQ(nullptr, point.getDrawProperties());
-}
-
-TEST(DexObject, StoresAnyStateItIsGiven) {
-  DexCircle circle;
-  circle.setStateType(IDexStateInterface::INACTIVE_STATE);
-  EXPECT_EQ(0, circle.getStateType());
-  circle.setStateType(static_cast<IDexStateInterface::ECurrentState>(2));
-  EXPECT_EQ(2, circle.getStateType());
-}
-
-TEST(DexObject, KeepsTheLayerAndWhetherItCameFromTheCode) {
-  const DexLayer layer;
-  DexTextLabel label;
-  label.setLayer(&layer, true);
-  EXPECT_EQ(&layer, label.getLayer());
-  EXPECT_TRUE(label.isLayerByCode());
-  label.setLayer(nullptr, false);
-  EXPECT_EQ(nullptr, label.getLayer());
-  EXPECT_FALSE(label.isLayerByCode());
-}
-
-TEST(DexObject, EveryClassTellsItsKindAndGroup) {
+TEST(DexObject, EveryClassTellsItsKindAndGroupAndStartsActiveWithoutLayerNotesOrCodes) {
   DexDesignPoint designPoint;
   DexPtlPoint ptlPoint;
   DexSheetPoint sheetPoint;
@@ -106,265 +46,221 @@ TEST(DexObject, EveryClassTellsItsKindAndGroup) {
   const std::pair<DexObject*, std::pair<int, int>> expected[] = {
       {&designPoint, {0, 0}}, {&ptlPoint, {1, 0}}, {&sheetPoint, {3, 1}},
       {&polyLine, {4, 2}},    {&area, {5, 2}},     {&breakline, {6, 2}},
-      {&arc, {7, 2}},         {&circle, {12, 2}},  {&label, {11, 0}},
-  };
+      {&arc, {7, 2}},         {&circle, {12, 2}},  {&label, {11, 0}}};
   for (const auto& [object, kindAndGroup] : expected) {
-    EXPECT_EQ(kindAndGroup.first, object->getType());
-    EXPECT_EQ(kindAndGroup.second, object->getGroupType());
-    EXPECT_EQ(1, object->getStateType());
+    EXPECT_TRUE(object->getType() == kindAndGroup.first && object->getGroupType() == kindAndGroup.second);
+    EXPECT_TRUE(object->getStateType() == 1 && object->getLayer() == nullptr && !object->isLayerByCode() &&
+                object->getPhotoNotes() == nullptr && object->getNumberOfCodes() == 0 &&
+                object->getDrawProperties() == nullptr);
   }
+  circle.setStateType(static_cast<IDexStateInterface::ECurrentState>(2));  // any state is stored
+  EXPECT_EQ(2, circle.getStateType());
+  const DexLayer layer;
+  label.setLayer(&layer, true);
+  EXPECT_TRUE(label.getLayer() == &layer && label.isLayerByCode());
 }
 
-// ---- Drawing properties -------------------------------------------------------------------------
-
-TEST(DexObject, ReplacingDrawingPropertiesDeletesTheOldOnesButNotTheSameOnes) {
+TEST(DexObject, OwnsItsDrawingPropertiesAndPhotoNotesAndDeletesWhatItReplaces) {
   int deletions = 0;
-  auto* const first = new CountedLineProperties(deletions);
-  DexPolyLine line(false);
-  line.setDrawProperties(first);
-  line.setDrawProperties(first);
-  EXPECT_EQ(0, deletions);
-  EXPECT_EQ(first, line.getDrawProperties());
-  line.setDrawProperties(new CountedLineProperties(deletions));
-  EXPECT_EQ(1, deletions);
-  line.setDrawProperties(nullptr);
-  EXPECT_EQ(2, deletions);
-  EXPECT_EQ(nullptr, line.getDrawProperties());
-}
-
-TEST(DexObject, DeletesItsDrawingPropertiesAndPhotoNotesWithItself) {
-  int propertyDeletions = 0;
-  int noteDeletions = 0;
   {
+    auto* const properties = new CountedLineProperties(deletions);
+    auto* const notes = new CountedPhotoNotes(deletions);
     DexArc arc;
-    arc.setDrawProperties(new CountedLineProperties(propertyDeletions));
-    arc.setPhotoNotes(new CountedPhotoNotes(noteDeletions));
+    for (int twice = 0; twice < 2; ++twice) {  // the same again changes nothing
+      arc.setDrawProperties(properties);
+      arc.setPhotoNotes(notes);
+    }
+    EXPECT_EQ(0, deletions);
+    EXPECT_TRUE(arc.getDrawProperties() == properties && std::as_const(arc).getPhotoNotes() == notes);
+    arc.setDrawProperties(new CountedLineProperties(deletions));
+    arc.setPhotoNotes(new CountedPhotoNotes(deletions));
+    EXPECT_EQ(2, deletions);
+    arc.setDrawProperties(nullptr);
+    EXPECT_EQ(3, deletions);
   }
-  EXPECT_EQ(1, propertyDeletions);
-  EXPECT_EQ(1, noteDeletions);
+  EXPECT_EQ(4, deletions);  // and with itself
 }
 
-// ---- Drawing properties by code -----------------------------------------------------------------
-
-TEST(DexObject, DrawingPropertiesByCodeWithoutCodeAreLoggedAndNull) {
+TEST(DexObject, DrawingPropertiesByCodeComeFromTheFirstCodeOrItsLayerAndWithoutCodeAreLogged) {
   const dex_test::LogCapture log;
-  const DexDesignPoint point;
-  EXPECT_EQ(nullptr, point.getDrawPropertiesByCode(IDexDrawProperties::DRAW_POINT));
-  ASSERT_EQ(1u, log.size());
-  EXPECT_EQ(kSource, log.records()[0].source);
-  EXPECT_EQ(detail::kDrawPropertiesByCodeWithoutCodeLine, log.records()[0].line);
+  const DexDesignPoint uncoded;
+  EXPECT_EQ(nullptr, uncoded.getDrawPropertiesByCode(IDexDrawProperties::DRAW_POINT));
+  EXPECT_EQ(nullptr, uncoded.getDrawPropertiesByCodeLayer(IDexDrawProperties::DRAW_LINE));
+  EXPECT_EQ(1, log.count(detail::kObjectsLogSource, detail::kDrawPropertiesByCodeWithoutCodeLine));
+  EXPECT_EQ(1, log.count(detail::kObjectsLogSource, detail::kDrawPropertiesByCodeLayerWithoutCodeLine));
   EXPECT_TRUE(log.records()[0].message.empty());
-}
-
-TEST(DexObject, DrawingPropertiesByCodeLayerWithoutCodeAreLoggedAndNull) {
-  const dex_test::LogCapture log;
-  const DexPolyLine line(false);
-  EXPECT_EQ(nullptr, line.getDrawPropertiesByCodeLayer(IDexDrawProperties::DRAW_LINE));
-  ASSERT_EQ(1u, log.size());
-  EXPECT_EQ(kSource, log.records()[0].source);
-  EXPECT_EQ(detail::kDrawPropertiesByCodeLayerWithoutCodeLine, log.records()[0].line);
-  EXPECT_TRUE(log.records()[0].message.empty());
-}
-
-TEST(DexObject, DrawingPropertiesByCodeComeFromTheFirstCodesDescription) {
+  DexLayer layer;
+  layer.setDrawProperties(IDexDrawProperties::DRAW_LINE, linePropertiesOf(0xABCDEF));
   DexCodeDescription first(L"FENCE");
   first.setDrawProperties(IDexDrawProperties::DRAW_LINE, linePropertiesOf(0x0000FF));
+  first.setLayer(&layer);
   DexCodeDescription second(L"WALL");
   second.setDrawProperties(IDexDrawProperties::DRAW_LINE, linePropertiesOf(0x00FF00));
   DexPolyLine line(false);
   line.addCode(codeOf(&first));
   line.addCode(codeOf(&second));
-  const dex_test::LogCapture log;
   EXPECT_EQ(first.getDrawProperties(IDexDrawProperties::DRAW_LINE),
             line.getDrawPropertiesByCode(IDexDrawProperties::DRAW_LINE));
-  EXPECT_EQ(nullptr, line.getDrawPropertiesByCode(IDexDrawProperties::DRAW_AREA));
-  EXPECT_EQ(nullptr, line.getDrawPropertiesByCode(3));
-  EXPECT_EQ(0u, log.size());
-}
-
-TEST(DexObject, DrawingPropertiesByCodeOfACodeWithoutDescriptionAreNullWithoutLog) {
-  DexDesignPoint point;
-  point.addCode(codeOf(nullptr));
-  const dex_test::LogCapture log;
-  EXPECT_EQ(nullptr, point.getDrawPropertiesByCode(IDexDrawProperties::DRAW_POINT));
-  EXPECT_EQ(nullptr, point.getDrawPropertiesByCodeLayer(IDexDrawProperties::DRAW_POINT));
-  EXPECT_EQ(0u, log.size());
-}
-
-TEST(DexObject, DrawingPropertiesByCodeLayerComeFromTheLayerOfTheFirstCode) {
-  const auto layer = layerWithLineColor(0xABCDEF);
-  DexCodeDescription withLayer(L"EDGE");
-  withLayer.setLayer(layer.get());
-  const DexCodeDescription withoutLayer(L"BARE");
-  DexPolyLine line(false);
-  line.addCode(codeOf(&withLayer));
-  EXPECT_EQ(layer->getDrawProperties(IDexDrawProperties::DRAW_LINE),
+  EXPECT_TRUE(line.getDrawPropertiesByCode(IDexDrawProperties::DRAW_AREA) == nullptr &&
+              line.getDrawPropertiesByCode(3) == nullptr);
+  EXPECT_EQ(layer.getDrawProperties(IDexDrawProperties::DRAW_LINE),
             line.getDrawPropertiesByCodeLayer(IDexDrawProperties::DRAW_LINE));
   EXPECT_EQ(nullptr, line.getDrawPropertiesByCodeLayer(IDexDrawProperties::DRAW_POINT));
-
-  DexPolyLine other(false);
-  other.addCode(codeOf(&withoutLayer));
-  other.addCode(codeOf(&withLayer));
-  EXPECT_EQ(nullptr, other.getDrawPropertiesByCodeLayer(IDexDrawProperties::DRAW_LINE));
+  DexPolyLine other(false);  // the first code has no layer
+  other.addCode(codeOf(&second));
+  other.addCode(codeOf(&first));
+  DexDesignPoint undescribed;
+  undescribed.addCode(codeOf(nullptr));
+  EXPECT_TRUE(other.getDrawPropertiesByCodeLayer(IDexDrawProperties::DRAW_LINE) == nullptr &&
+              undescribed.getDrawPropertiesByCode(IDexDrawProperties::DRAW_POINT) == nullptr &&
+              undescribed.getDrawPropertiesByCodeLayer(IDexDrawProperties::DRAW_POINT) == nullptr);
+  EXPECT_EQ(2u, log.size());
 }
 
-// ---- Photo notes --------------------------------------------------------------------------------
-
-TEST(DexObject, PhotoNotesAreOwnedAndReplacedNotesDeleted) {
+TEST(DexObject, CommonCopySharesTheLayerAppendsCodesAndDuplicatesPropertiesStateAndPhotoNotes) {
   int deletions = 0;
-  auto* const first = new CountedPhotoNotes(deletions);
-  DexTextLabel label;
-  label.setPhotoNotes(first);
-  label.setPhotoNotes(first);
-  EXPECT_EQ(0, deletions);
-  EXPECT_EQ(first, label.getPhotoNotes());
-  EXPECT_EQ(first, std::as_const(label).getPhotoNotes());
-  label.setPhotoNotes(new CountedPhotoNotes(deletions));
-  EXPECT_EQ(1, deletions);
-  label.setPhotoNotes(nullptr);
-  EXPECT_EQ(2, deletions);
-}
-
-// ---- Copying the common part --------------------------------------------------------------------
-
-TEST(DexObject, CommonCopySharesTheLayerButNotTheLayerByCodeFlag) {
   const DexLayer layer;
-  ExposedPoint source;
-  source.setLayer(&layer, true);
-  DexDesignPoint target;
-  source.copyCommonData(&target);
-  EXPECT_EQ(&layer, target.getLayer());
-  EXPECT_FALSE(target.isLayerByCode());
-}
-
-TEST(DexObject, CommonCopyAppendsCodesThatTheTargetOwns) {
   const DexCodeDescription tree(L"TREE");
   const DexCodeDescription pole(L"POLE");
   ExposedPoint source;
+  source.setLayer(&layer, true);
   source.addCode(codeOf(&tree, {L"1"}));
-  DexDesignPoint target;
-  target.addCode(codeOf(&pole));
-  source.copyCommonData(&target);
-  ASSERT_EQ(2, target.getNumberOfCodes());
-  EXPECT_EQ(&pole, target.getCode(0)->getDescription());
-  EXPECT_EQ(&tree, target.getCode(1)->getDescription());
-  EXPECT_NE(source.getCode(0), target.getCode(1));
-  EXPECT_EQ(L"1", target.getCode(1)->getCodeStringAt(0));
-}
-
-TEST(DexObject, CommonCopyClonesTheDrawingPropertiesAndReplacesTheTargets) {
-  int deletions = 0;
-  ExposedPoint source;
-  auto* const sourceProperties = new DexDrawPointProperties();
-  sourceProperties->setColor(0x112233);
-  source.setDrawProperties(sourceProperties);
-  DexDesignPoint target;
-  target.setDrawProperties(new CountedLineProperties(deletions));
-  source.copyCommonData(&target);
-  EXPECT_EQ(1, deletions);
-  ASSERT_NE(nullptr, target.getDrawProperties());
-  EXPECT_NE(source.getDrawProperties(), target.getDrawProperties());
-  EXPECT_EQ(IDexDrawProperties::DRAW_POINT, target.getDrawProperties()->getType());
-  EXPECT_EQ(0x112233u, colorOf(target.getDrawProperties()));
-}
-
-TEST(DexObject, CommonCopyWithoutDrawingPropertiesClearsTheTargets) {
-  int deletions = 0;
-  const ExposedPoint source;
-  DexDesignPoint target;
-  target.setDrawProperties(new CountedLineProperties(deletions));
-  source.copyCommonData(&target);
-  EXPECT_EQ(1, deletions);
-  EXPECT_EQ(nullptr, target.getDrawProperties());
-}
-
-TEST(DexObject, CommonCopyTakesTheState) {
-  ExposedPoint source;
+  auto* const properties = new DexDrawPointProperties();
+  properties->setColor(0x112233);
+  source.setDrawProperties(properties);
   source.setStateType(IDexStateInterface::INACTIVE_STATE);
-  DexDesignPoint target;
-  source.copyCommonData(&target);
-  EXPECT_EQ(0, target.getStateType());
-}
-
-TEST(DexObject, CommonCopyWithoutPhotoNotesDeletesTheTargets) {
-  int deletions = 0;
-  const ExposedPoint source;
-  DexDesignPoint target;
-  target.setPhotoNotes(new CountedPhotoNotes(deletions));
-  source.copyCommonData(&target);
-  EXPECT_EQ(1, deletions);
-  EXPECT_EQ(nullptr, target.getPhotoNotes());
-}
-
-TEST(DexObject, CommonCopyGivesATargetWithoutPhotoNotesItsOwnCopy) {
-  ExposedPoint source;
   source.setPhotoNotes(photoNotesOf({L"a.jpg", L"b.jpg"}));
   DexDesignPoint target;
+  target.addCode(codeOf(&pole));
+  target.setDrawProperties(new CountedLineProperties(deletions));
   source.copyCommonData(&target);
-  ASSERT_NE(nullptr, target.getPhotoNotes());
-  EXPECT_NE(source.getPhotoNotes(), target.getPhotoNotes());
-  EXPECT_EQ(2, target.getPhotoNotes()->getNumberOfPhotoNotes());
-  EXPECT_NE(source.getPhotoNotes()->getPhotoNote(0), target.getPhotoNotes()->getPhotoNote(0));
-}
-
-TEST(DexObject, CommonCopyAssignsPhotoNotesIntoTheTargetsOwn) {
-  int deletions = 0;
-  ExposedPoint source;
-  source.setPhotoNotes(photoNotesOf({L"new.jpg"}));
-  DexDesignPoint target;
+  EXPECT_TRUE(target.getLayer() == &layer && !target.isLayerByCode() && target.getStateType() == 0);
+  ASSERT_EQ(2, target.getNumberOfCodes());
+  EXPECT_TRUE(target.getCode(0)->getDescription() == &pole && target.getCode(1)->getDescription() == &tree &&
+              target.getCode(1) != source.getCode(0) && target.getCode(1)->getCodeStringAt(0) == L"1");
+  EXPECT_EQ(1, deletions);
+  EXPECT_TRUE(target.getDrawProperties() != properties &&
+              target.getDrawProperties()->getType() == IDexDrawProperties::DRAW_POINT);
+  EXPECT_EQ(0x112233u, colorOf(target.getDrawProperties()));
+  EXPECT_TRUE(target.getPhotoNotes() != source.getPhotoNotes() &&
+              target.getPhotoNotes()->getNumberOfPhotoNotes() == 2);
+  // Notes are assigned into the target's own; a source without properties or notes clears them.
   auto* const targetNotes = new CountedPhotoNotes(deletions);
-  targetNotes->addPhotoNote(new vyn::ie::DexPhotoNote());
-  targetNotes->addPhotoNote(new vyn::ie::DexPhotoNote());
-  target.setPhotoNotes(targetNotes);
-  source.copyCommonData(&target);
-  EXPECT_EQ(0, deletions);
-  EXPECT_EQ(targetNotes, target.getPhotoNotes());
-  EXPECT_EQ(1, targetNotes->getNumberOfPhotoNotes());
-  EXPECT_EQ(L"new.jpg", firstPhotoFileOf(target));
-}
-
-TEST(DexObject, CommonCopyIntoNullOrItselfChangesNothing) {
-  const DexCodeDescription tree(L"TREE");
-  ExposedPoint source;
-  source.addCode(codeOf(&tree));
-  source.setPhotoNotes(photoNotesOf({L"a.jpg"}));
-  source.copyCommonData(nullptr);
+  targetNotes->addPhotoNote(new DexPhotoNote());
+  DexDesignPoint withNotes;
+  withNotes.setPhotoNotes(targetNotes);
+  source.copyCommonData(&withNotes);
+  EXPECT_TRUE(withNotes.getPhotoNotes() == targetNotes && targetNotes->getNumberOfPhotoNotes() == 2);
+  EXPECT_EQ(L"a.jpg", firstPhotoFileOf(withNotes));
+  const ExposedPoint bare;
+  bare.copyCommonData(&withNotes);
+  EXPECT_TRUE(withNotes.getPhotoNotes() == nullptr && withNotes.getDrawProperties() == nullptr);
+  EXPECT_EQ(2, deletions);
+  source.copyCommonData(nullptr);  // into null or itself: no change
   source.copyCommonData(&source);
-  EXPECT_EQ(1, source.getNumberOfCodes());
-  EXPECT_EQ(L"a.jpg", firstPhotoFileOf(source));
+  EXPECT_TRUE(source.getNumberOfCodes() == 1 && firstPhotoFileOf(source) == L"a.jpg");
 }
-
-// ---- Virtual table ------------------------------------------------------------------------------
-
-namespace {
-
-// Names the protected copy of the common part for the slot test.
-class SlotProbe : public DexDesignPoint {
- public:
-  static auto copyCommonDataSlot() { return dex_test::vtableEntryOf(&SlotProbe::copyCommonData); }
-};
-
-}  // namespace
 
 TEST(DexObject, VirtualOperationsKeepTheirSlotOrder) {
   // A destructor takes two entries, so slot n of the plug-in interface is entry n + 1.
-  const auto setStateType = dex_test::vtableEntryOf(&DexObject::setStateType);
-  if (!setStateType) GTEST_SKIP() << "virtual table layout not observable on this platform";
-  EXPECT_EQ(2, *setStateType);
-  EXPECT_EQ(3, dex_test::vtableEntryOf(&DexObject::getStateType).value_or(-1));
-  EXPECT_EQ(4, dex_test::vtableEntryOf(&DexObject::clone).value_or(-1));
-  EXPECT_EQ(5, dex_test::vtableEntryOf(&DexObject::shiftCoords).value_or(-1));
-  EXPECT_EQ(6, dex_test::vtableEntryOf(&DexObject::getGroupType).value_or(-1));
-  EXPECT_EQ(7, SlotProbe::copyCommonDataSlot().value_or(-1));
-  EXPECT_EQ(8, dex_test::vtableEntryOf(&DexObject::getDrawProperties).value_or(-1));
-  EXPECT_EQ(9, dex_test::vtableEntryOf(&DexObject::setDrawProperties).value_or(-1));
+  if (!dex_test::vtableEntryOf(&DexObject::setStateType))
+    GTEST_SKIP() << "virtual table layout not observable";
+  EXPECT_EQ(2, dex_test::vtableEntryOf(&DexObject::setStateType));
+  EXPECT_EQ(3, dex_test::vtableEntryOf(&DexObject::getStateType));
+  EXPECT_EQ(4, dex_test::vtableEntryOf(&DexObject::clone));
+  EXPECT_EQ(5, dex_test::vtableEntryOf(&DexObject::shiftCoords));
+  EXPECT_EQ(6, dex_test::vtableEntryOf(&DexObject::getGroupType));
+  EXPECT_EQ(7, ExposedPoint::copyCommonDataSlot());
+  EXPECT_EQ(8, dex_test::vtableEntryOf(&DexObject::getDrawProperties));
+  EXPECT_EQ(9, dex_test::vtableEntryOf(&DexObject::setDrawProperties));
+  EXPECT_GT(dex_test::vtableEntryOf(&DexDesignPoint::getType).value_or(0), 9);  // the other interfaces follow
+  EXPECT_EQ(4, dex_test::vtableEntryOf(&DexTextLabel::clone));
+  EXPECT_EQ(2, dex_test::vtableEntryOf(&DexParcel::getType));
+  EXPECT_EQ(3, dex_test::vtableEntryOf(&DexParcel::setCentralPoint));
+  EXPECT_EQ(4, dex_test::vtableEntryOf(&DexParcel::getCentralPoint));
 }
 
-TEST(DexObject, SubclassesImplementTheOtherInterfacesAfterTheCommonSlots) {
-  const auto getType = dex_test::vtableEntryOf(&DexDesignPoint::getType);
-  if (!getType) GTEST_SKIP() << "virtual table layout not observable on this platform";
-  EXPECT_GT(*getType, 9);
-  EXPECT_EQ(9, dex_test::vtableEntryOf(&DexDesignPoint::setDrawProperties).value_or(-1));
-  EXPECT_EQ(4, dex_test::vtableEntryOf(&DexTextLabel::clone).value_or(-1));
-  EXPECT_EQ(5, dex_test::vtableEntryOf(&DexArc::shiftCoords).value_or(-1));
+TEST(DexTextLabel, KeepsItsFieldsAndNameInItsStationAndShiftsWithoutTurningTheText) {
+  DexTextLabel label;
+  EXPECT_TRUE(label.getInsertionPoint() == DexTextLabel::INSERT_MIDDLE_CENTER && !label.getBold() &&
+              !label.getOpaque() && label.getHeightInMeters() == 0.0 && label.getStation().getCSType() == 5);
+  label.setText(L"Manhole 3");
+  label.setFontName(L"Arial");
+  label.setHeightInMeters(0.35);
+  label.setInsertionPoint(DexTextLabel::INSERT_BOTTOM_LEFT);
+  label.setBold(true);
+  label.setItalic(true);
+  label.setUnderline(true);
+  label.setDrawBox(true);
+  label.setOpaque(true);
+  EXPECT_TRUE(label.getText() == L"Manhole 3" && label.getFontName() == L"Arial" &&
+              label.getHeightInMeters() == 0.35 && label.getInsertionPoint() == 7 && label.getBold() &&
+              label.getItalic() && label.getUnderline() && label.getDrawBox() && label.getOpaque());
+  label.setName(L"T1");
+  EXPECT_EQ(L"T1", label.getStation().getName());
+  label.setStation(stationAt(1.0, 2.0, 3.0));  // the name goes on to an unnamed station
+  EXPECT_EQ(L"T1", label.getName());
+  label.setCoords(1.0, kNoValue, 3.0);
+  EXPECT_FALSE(label.getStation().isHorizCoordsDefined());
+  label.setCoords(1.0, 0.0, 0.0, 4.0);
+  EXPECT_EQ(4.0, label.getStation().getHeight());
+  label.setRotationAngle(15.0);
+  label.shiftCoords(DexPosition3D(0.0, 0.0, 0.0), 1.0, 1.0, 1.0, 90.0);
+  EXPECT_NEAR(0.0, label.getStation().getX(), 1e-12);
+  EXPECT_NEAR(1.0, label.getStation().getY(), 1e-12);
+  EXPECT_EQ(15.0, label.getRotationAngle());
 }
+
+TEST(DexParcel, KeepsItsLinksWhichCopiesShareAndLogsANullAlignment) {
+  const dex_test::LogCapture log;
+  DexHorizontalAlignment alignment;
+  DexDesignPoint point;
+  DexParcel parcel;
+  EXPECT_TRUE(parcel.getType() == 10 && parcel.getHAlignment() == nullptr &&
+              parcel.getCentralPoint() == nullptr);
+  parcel.setName(L"LOT 7");
+  parcel.setHAlignment(&alignment);
+  parcel.setHAlignment(nullptr);  // keeps the one set before
+  parcel.setCentralPoint(&point);
+  EXPECT_EQ(1, log.count(detail::kParcelLogSource, detail::kParcelNullAlignmentLine));
+  const DexParcel copy(parcel);
+  DexParcel assigned;
+  assigned = parcel;
+  EXPECT_TRUE(copy.getHAlignment() == &alignment && copy.getCentralPoint() == &point &&
+              copy.getName() == L"LOT 7");
+  EXPECT_EQ(&point, assigned.getCentralPoint());
+}
+
+TEST(DexRegion, KeepsVerticesOwnsItsAreaPropertiesAndLogsAVertexPastTheEnd) {
+  int deletions = 0;
+  const dex_test::LogCapture log;
+  const DexLayer layer;
+  auto* const region = new DexRegion();
+  EXPECT_TRUE(region->getType() == 13 && region->getVerticesCount() == 0 && region->getRegionType() == 0);
+  region->setName(L"R");
+  region->setLayer(&layer);
+  region->setRegionType(42);
+  region->addVertex(DexPositionWithBulge(1, 2, 3, 0.5));
+  region->addVertex(DexPositionWithBulge(4, 5, 6, 0.25));
+  EXPECT_TRUE(region->getVertexAt(0) == DexPosition3D(1, 2, 3) && region->getVertexAt(0).getBulge() == 0.5 &&
+              region->getVertexAt(1).x == 4.0);
+  EXPECT_TRUE(region->getVertexAt(5) == DexPosition3D(0, 0, 0) && region->getVertexAt(2).getBulge() == 0.0);
+  EXPECT_EQ(2, log.count(detail::kRegionLogSource, detail::kRegionVertexIndexLine));
+  auto* const properties = new CountedAreaProperties(deletions);
+  properties->setColor(0x123);
+  region->setAreaDrawProperties(properties);
+  region->setAreaDrawProperties(properties);
+  EXPECT_EQ(0, deletions);
+  const DexRegion copy(*region);  // duplicates the properties, shares the layer
+  DexRegion assigned;
+  assigned = *region;
+  region->setAreaDrawProperties(new DexDrawAreaProperties());
+  EXPECT_EQ(1, deletions);
+  delete region;
+  EXPECT_TRUE(copy.getName() == L"R" && copy.getLayer() == &layer && copy.getRegionType() == 42 &&
+              copy.getVerticesCount() == 2);
+  EXPECT_EQ(0x123u, colorOf(copy.getAreaDrawProperties()));
+  EXPECT_TRUE(assigned.getAreaDrawProperties() != nullptr && assigned.getVerticesCount() == 2);
+}
+
+}  // namespace

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <initializer_list>
+#include <utility>
 
 #include "ieObjects/IECodesDataInterface.h"
 #include "ieObjects/IEDataDictionary.h"
@@ -12,6 +13,29 @@
 // Shared fixtures of the survey-object tests: property objects and photo notes that count their
 // deletions, so that ownership becomes visible, and small builders of stations, codes and notes.
 namespace objects_test {
+
+// Any class of the model that counts its deletions (constructor arguments follow the counter).
+template <class T>
+class Counted : public T {
+ public:
+  template <class... Arguments>
+  explicit Counted(int& deletions, Arguments&&... arguments)
+      : T(std::forward<Arguments>(arguments)...), deletions_(deletions) {}
+  ~Counted() override { ++deletions_; }
+
+ private:
+  int& deletions_;
+};
+
+// A new object of class T with the name (and, where T has one, the edit state); the caller owns it.
+template <class T>
+T* named(const wchar_t* name,
+         vyn::ie::IDexStateInterface::ECurrentState state = vyn::ie::IDexStateInterface::ACTIVE_STATE) {
+  auto* const object = new T();
+  object->setName(name);
+  if constexpr (requires { object->setStateType(state); }) object->setStateType(state);
+  return object;
+}
 
 // Line properties that count their deletions. Their clones are plain line properties.
 class CountedLineProperties : public vyn::ie::DexDrawLineProperties {

@@ -1,30 +1,35 @@
+// The owning containers of the model: the owned pointer, the owning list and map, and the object list
+// that owns nothing.
 #include "ieObjects/IEOwningList.h"
 
 #include <gtest/gtest.h>
 
 #include <climits>
 #include <iterator>
+#include <string>
 #include <type_traits>
 #include <utility>
-#include <vector>
 
 #include "hostlibs/VynAlloc.h"
+#include "ieObjects/IEObjectList.h"
+#include "ieObjects/IEObjects.h"
+#include "ieObjects/IEOwnedPointer.h"
+#include "ieObjects/IEOwningMap.h"
+#include "support/PrintString.h"
 
 namespace {
 
-using vyn::ie::DexCopyByClone;
-using vyn::ie::DexOwningList;
+using namespace vyn::ie;
 
 // Counts the live instances so that a test sees every delete (and LeakSanitizer any leak).
 class Counted {
  public:
   VYN_CLASS_ALLOCATOR
-
   explicit Counted(int value) : value_(value) { ++live_; }
   Counted(const Counted& other) : value_(other.value_) { ++live_; }
   Counted& operator=(const Counted&) = default;
   virtual ~Counted() { --live_; }
-
+  virtual Counted* clone() const { return new Counted(*this); }
   int value() const { return value_; }
   void setValue(int value) { value_ = value; }
   static int live() { return live_; }
@@ -34,231 +39,186 @@ class Counted {
   static inline int live_ = 0;
 };
 
-// A polymorphic family copied through clone().
-class Shape {
- public:
-  VYN_CLASS_ALLOCATOR
-  virtual ~Shape() = default;
-  virtual Shape* clone() const = 0;
-  virtual int corners() const = 0;
+// A subclass whose clone() answers its base class, as some families' clone() does.
+struct Narrowing : Counted {
+  using Counted::Counted;
+  Counted* clone() const override { return new Counted(*this); }
 };
 
-class Triangle : public Shape {
- public:
-  Shape* clone() const override { return new Triangle(*this); }
-  int corners() const override { return 3; }
-};
-
-class Square : public Shape {
- public:
-  Shape* clone() const override { return new Square(*this); }
-  int corners() const override { return 4; }
-};
-
-std::vector<int> valuesOf(const DexOwningList<Counted>& list) {
-  std::vector<int> values;
+std::string valuesOf(const DexOwningList<Counted>& list) {
+  std::string values;
   for (const Counted* item : list)
-    values.push_back(item->value());
+    values += std::to_string(item->value()) + " ";
   return values;
 }
 
-class DexOwningListTest : public ::testing::Test {
+class Containers : public ::testing::Test {
  protected:
-  void SetUp() override { liveBefore_ = Counted::live(); }
   void TearDown() override {
     EXPECT_EQ(liveBefore_, Counted::live()) << "an item leaked or was deleted twice";
   }
 
  private:
-  int liveBefore_ = 0;
+  int liveBefore_ = Counted::live();
 };
 
-}  // namespace
-
-TEST_F(DexOwningListTest, DestructorDeletesEveryItem) {
-  {
-    DexOwningList<Counted> list;
-    EXPECT_TRUE(list.add(new Counted(1)));
-    EXPECT_TRUE(list.add(new Counted(2)));
-    EXPECT_EQ(2, list.count());
-    EXPECT_EQ(2, Counted::live());
-  }
-  EXPECT_EQ(0, Counted::live());
+TEST_F(Containers, OwnedPointerDeletesWhatItReplacesAndCopiesByCopyOrByClone) {
+  auto* const first = new Counted(1);
+  DexOwnedPointer<Counted> pointer(first);
+  pointer.reset(first);
+  EXPECT_EQ(first, pointer.get());
+  pointer.reset(new Counted(2));
+  EXPECT_EQ(2, pointer.get()->value());
+  pointer.reset();
+  EXPECT_FALSE(pointer);
+  DexOwnedPointer<Counted, DexCopyByClone> original(new Counted(7));
+  DexOwnedPointer<Counted, DexCopyByClone> copy(original);
+  EXPECT_TRUE(copy && copy.get() != original.get() && copy.get()->value() == 7);
+  Counted* const held = copy.get();
+  copy = std::as_const(copy);
+  EXPECT_EQ(held, copy.get());
+  copy = DexOwnedPointer<Counted, DexCopyByClone>();
+  EXPECT_FALSE(copy);
+  // A typed clone of another class leaves the copy empty.
+  DexOwnedPointer<Narrowing, DexCopyByCloneAs> narrowing(new Narrowing(3));
+  EXPECT_FALSE((DexOwnedPointer<Narrowing, DexCopyByCloneAs>(narrowing)));
+  DexOwnedPointer<Counted, DexCopyByCloneAs> typed(new Counted(4));
+  EXPECT_EQ(4, (DexOwnedPointer<Counted, DexCopyByCloneAs>(typed).get()->value()));
 }
 
-TEST_F(DexOwningListTest, DeclinesNullItems) {
+TEST_F(Containers, OwningListDeclinesNullAnswersNullOutsideAndRemovesDetachesAndInsertsByIndex) {
   DexOwningList<Counted> list;
-  EXPECT_FALSE(list.add(nullptr));
-  EXPECT_FALSE(list.insert(0, nullptr));
-  EXPECT_EQ(0, list.count());
-  EXPECT_TRUE(list.isEmpty());
-}
-
-TEST_F(DexOwningListTest, AtAnswersNullOutsideTheList) {
-  DexOwningList<Counted> list;
-  EXPECT_EQ(nullptr, list.at(0));
-  list.add(new Counted(7));
+  EXPECT_FALSE(list.add(nullptr) || list.insert(0, nullptr));
+  EXPECT_TRUE(list.isEmpty() && list.at(0) == nullptr);
+  for (int value = 2; value <= 4; ++value)
+    EXPECT_TRUE(list.add(new Counted(value)));
+  EXPECT_TRUE(list.insert(0, new Counted(1)) && list.insert(4, new Counted(6)) &&
+              list.insert(4, new Counted(5)));
+  Counted declined(9);  // a declined item stays with the caller
+  EXPECT_FALSE(list.insert(7, &declined) || list.insert(-1, &declined));
+  EXPECT_EQ("1 2 3 4 5 6 ", valuesOf(list));
   const auto& constList = list;
-  EXPECT_EQ(7, list.at(0)->value());
-  EXPECT_EQ(7, constList.at(0)->value());
-  for (const int index : {-1, 1, INT_MAX, INT_MIN}) {
-    EXPECT_EQ(nullptr, list.at(index)) << index;
-    EXPECT_EQ(nullptr, constList.at(index)) << index;
-  }
   static_assert(std::is_same_v<const Counted*, decltype(constList.at(0))>);
-}
-
-TEST_F(DexOwningListTest, RemoveDeletesTheItemAndClosesTheGap) {
-  DexOwningList<Counted> list;
+  for (const int index : {-1, 6, INT_MAX, INT_MIN})
+    EXPECT_TRUE(list.at(index) == nullptr && constList.at(index) == nullptr) << index;
+  EXPECT_TRUE(list.remove(1));
+  EXPECT_FALSE(list.remove(5) || list.remove(-1));
+  Counted* const detached = list.detach(0);
+  EXPECT_EQ(1, detached->value());
+  EXPECT_TRUE(list.detach(4) == nullptr && list.detach(-1) == nullptr);
+  EXPECT_EQ("3 4 5 6 ", valuesOf(list));
+  list.clear();
+  EXPECT_EQ(0, list.count());
+  delete detached;  // alive until its new owner deletes it
   for (int value = 1; value <= 3; ++value)
     list.add(new Counted(value));
-  EXPECT_TRUE(list.remove(1));
-  EXPECT_EQ(2, Counted::live());
-  EXPECT_EQ((std::vector<int>{1, 3}), valuesOf(list));
-  EXPECT_FALSE(list.remove(2));
-  EXPECT_FALSE(list.remove(-1));
-  EXPECT_EQ(2, list.count());
-}
-
-TEST_F(DexOwningListTest, DetachHandsTheItemBackToTheCaller) {
-  DexOwningList<Counted> list;
-  list.add(new Counted(1));
   list.add(new Counted(2));
-  Counted* const detached = list.detach(0);
-  ASSERT_NE(nullptr, detached);
-  EXPECT_EQ(1, detached->value());
-  EXPECT_EQ(1, list.count());
-  EXPECT_EQ(2, list.at(0)->value());
-  EXPECT_EQ(nullptr, list.detach(1));
-  EXPECT_EQ(nullptr, list.detach(-1));
-  list.clear();
-  EXPECT_EQ(1, Counted::live());  // the detached item is alive until its new owner deletes it
-  delete detached;
+  for (Counted* item : list)  // iterates in order, with const pointers through a const list
+    item->setValue(item->value() * 10);
+  static_assert(std::is_same_v<const Counted*, decltype(*constList.begin())>);
+  static_assert(std::forward_iterator<DexOwningList<Counted>::const_iterator>);
+  EXPECT_EQ(4, std::distance(list.begin(), list.end()));
+  Counted* const found = list.findFirst([](const Counted& item) { return item.value() == 20; });
+  EXPECT_TRUE(found == list.at(1) && list.indexOf(found) == 1);
+  EXPECT_EQ(nullptr, list.findFirst([](const Counted& item) { return item.value() == 5; }));
+  const Counted outsider(20);
+  EXPECT_TRUE(list.indexOf(&outsider) == -1 && list.indexOf(nullptr) == -1);
 }
 
-TEST_F(DexOwningListTest, InsertPlacesBeforeTheIndexAndAppendsAtTheEnd) {
-  DexOwningList<Counted> list;
-  list.add(new Counted(2));
-  EXPECT_TRUE(list.insert(0, new Counted(1)));
-  EXPECT_TRUE(list.insert(2, new Counted(4)));
-  EXPECT_TRUE(list.insert(2, new Counted(3)));
-  EXPECT_EQ((std::vector<int>{1, 2, 3, 4}), valuesOf(list));
-
-  auto* const declined = new Counted(9);
-  EXPECT_FALSE(list.insert(5, declined));
-  EXPECT_FALSE(list.insert(-1, declined));
-  EXPECT_EQ(4, list.count());
-  delete declined;  // a declined item stays with the caller
-}
-
-TEST_F(DexOwningListTest, ClearDeletesEveryItem) {
-  DexOwningList<Counted> list;
-  list.add(new Counted(1));
-  list.add(new Counted(2));
-  list.clear();
-  EXPECT_EQ(0, list.count());
-  EXPECT_EQ(0, Counted::live());
-  list.clear();
-}
-
-TEST_F(DexOwningListTest, CopyOwnsItsOwnItems) {
+TEST_F(Containers, OwningListCopiesOwnTheirItemsAndMovesTransferThem) {
+  const int base = Counted::live();
   auto* original = new DexOwningList<Counted>();
   original->add(new Counted(1));
   original->add(new Counted(2));
   const DexOwningList<Counted> copy(*original);
   EXPECT_NE(original->at(0), copy.at(0));
-  original->at(0)->setValue(10);
-  delete original;
-  EXPECT_EQ((std::vector<int>{1, 2}), valuesOf(copy));
-  EXPECT_EQ(2, Counted::live());
-}
-
-TEST_F(DexOwningListTest, AssignmentReplacesTheItemsWithCopies) {
   DexOwningList<Counted> target;
   target.add(new Counted(5));
-  {
-    DexOwningList<Counted> source;
-    source.add(new Counted(1));
-    source.add(new Counted(2));
-    target = source;
-    EXPECT_EQ(4, Counted::live());  // the replaced item is deleted, the copies are new
-  }
-  EXPECT_EQ((std::vector<int>{1, 2}), valuesOf(target));
-}
-
-TEST_F(DexOwningListTest, SelfAssignmentChangesNothing) {
-  DexOwningList<Counted> list;
-  list.add(new Counted(1));
-  const Counted* const item = list.at(0);
-  auto& alias = list;
-  list = alias;
-  EXPECT_EQ(1, list.count());
-  EXPECT_EQ(item, list.at(0));
-  EXPECT_EQ(1, item->value());
-}
-
-TEST_F(DexOwningListTest, MovingTransfersTheItemsWithoutCopying) {
-  DexOwningList<Counted> source;
-  source.add(new Counted(1));
-  const Counted* const item = source.at(0);
-  DexOwningList<Counted> moved(std::move(source));
-  EXPECT_EQ(item, moved.at(0));
-  DexOwningList<Counted> target;
-  target.add(new Counted(2));
-  target = std::move(moved);
+  target = *original;  // the replaced item is deleted
+  original->at(0)->setValue(10);
+  delete original;
+  EXPECT_TRUE(valuesOf(copy) == "1 2 " && valuesOf(target) == "1 2 ");
+  const Counted* const item = target.at(0);
+  auto& alias = target;
+  target = alias;
   EXPECT_EQ(item, target.at(0));
-  EXPECT_EQ(1, Counted::live());
+  DexOwningList<Counted> moved(std::move(target));
+  DexOwningList<Counted> movedAgain;
+  movedAgain.add(new Counted(3));
+  movedAgain = std::move(moved);
+  EXPECT_EQ(item, movedAgain.at(0));
+  movedAgain.appendCopiesOf(copy);  // keeps the items already there
+  EXPECT_EQ("1 2 1 2 ", valuesOf(movedAgain));
+  EXPECT_NE(copy.at(0), movedAgain.at(2));
+  movedAgain.appendCopiesOf(movedAgain);
+  EXPECT_EQ(4, movedAgain.count());
+  EXPECT_EQ(base + 6, Counted::live());
+  DexOwningList<Counted, DexCopyByClone> clones;  // a clone copy keeps each item's class
+  clones.add(new Narrowing(7));
+  DexOwningList<Counted, DexCopyByClone> cloned;
+  cloned = clones;
+  EXPECT_EQ(7, cloned.at(0)->value());
 }
 
-TEST_F(DexOwningListTest, AppendCopiesOfKeepsTheItemsAlreadyThere) {
-  DexOwningList<Counted> list;
-  list.add(new Counted(1));
-  DexOwningList<Counted> other;
-  other.add(new Counted(2));
-  other.add(new Counted(3));
-  list.appendCopiesOf(other);
-  EXPECT_EQ((std::vector<int>{1, 2, 3}), valuesOf(list));
-  EXPECT_NE(other.at(0), list.at(1));
-  list.appendCopiesOf(list);
-  EXPECT_EQ(3, list.count());
+TEST_F(Containers, OwningMapKeepsTheFirstItemOfAKeyAndLeavesDeclinedItemsWithTheCaller) {
+  {
+    DexOwningMap<int, Counted> map;
+    auto* const first = new Counted(1);
+    Counted declined(2);
+    EXPECT_TRUE(map.add(2, first) && map.add(2, first) && map.add(5, first));  // held already: no change
+    EXPECT_FALSE(map.add(2, &declined) || map.add(3, nullptr));
+    EXPECT_TRUE(map.add(1, new Counted(3)));
+    EXPECT_TRUE(map.count() == 2 && map.find(2) == first && map.find(5) == nullptr && map.find(3) == nullptr);
+    EXPECT_TRUE(map.holds(first) && !map.holds(&declined) && map.begin()->first == 1);
+    EXPECT_TRUE(map.remove(1));
+    EXPECT_FALSE(map.remove(1));
+  }
+  DexOwningMap<int, Counted> map;
+  map.add(1, new Counted(1));
+  map.clear();
+  EXPECT_TRUE(map.count() == 0 && map.begin() == map.end());
 }
 
-TEST_F(DexOwningListTest, CloneCopyKeepsEachItemsClass) {
-  DexOwningList<Shape, DexCopyByClone> shapes;
-  shapes.add(new Triangle());
-  shapes.add(new Square());
-  DexOwningList<Shape, DexCopyByClone> copy;
-  copy = shapes;
-  shapes.clear();
-  ASSERT_EQ(2, copy.count());
-  EXPECT_EQ(3, copy.at(0)->corners());
-  EXPECT_EQ(4, copy.at(1)->corners());
-  EXPECT_NE(nullptr, dynamic_cast<const Square*>(copy.at(1)));
+// The names an object list answers from its cursor.
+std::wstring walk(const DexObjectList& list) {
+  std::wstring names;
+  for (const DexObject* object = list.getNextObjectInTheList(); object != nullptr;
+       object = list.getNextObjectInTheList())
+    names += std::wstring(object->getName().view()) + L" ";
+  return names;
 }
 
-TEST_F(DexOwningListTest, IteratesInListOrderWithConstPointersThroughAConstList) {
-  DexOwningList<Counted> list;
-  for (int value = 1; value <= 3; ++value)
-    list.add(new Counted(value));
-  for (Counted* item : list)
-    item->setValue(item->value() * 10);
-  const auto& constList = list;
-  static_assert(std::is_same_v<const Counted*, decltype(*constList.begin())>);
-  EXPECT_EQ((std::vector<int>{10, 20, 30}), valuesOf(constList));
-  EXPECT_EQ(3, std::distance(list.begin(), list.end()));
-  static_assert(std::forward_iterator<DexOwningList<Counted>::const_iterator>);
+TEST(DexObjectList, KeepsTheFirstObjectOfANameInNameOrderAndNeverDeletesThem) {
+  DexDesignPoint b;
+  b.setName(L"B");
+  DexArc a;
+  a.setName(L"A");
+  DexPolyLine c(false);
+  c.setName(L"C");
+  DexDesignPoint sameName;
+  sameName.setName(L"B");
+  auto* const list = new DexObjectList();
+  list->setName(L"Selection 1");
+  EXPECT_FALSE(list->addObject(nullptr));
+  EXPECT_TRUE(list->addObject(&b) && list->addObject(&c) && list->addObject(&a));
+  EXPECT_FALSE(list->addObject(&sameName));
+  EXPECT_TRUE(list->findObjectInTheList(L"B") == &b && list->findObjectInTheList(L"b") == nullptr &&
+              list->findObjectInTheList(L"C ") == nullptr);
+  EXPECT_EQ(L"A B C ", walk(*list));
+  EXPECT_EQ(nullptr, list->getNextObjectInTheList());
+  list->reset();
+  EXPECT_EQ(&a, list->getNextObjectInTheList());
+  const DexObjectList copy(*list);  // copies share the objects and read from the start
+  DexObjectList assigned;
+  assigned = *list;
+  delete list;
+  EXPECT_EQ(L"Selection 1", copy.getName());
+  EXPECT_TRUE(walk(copy) == L"A B C " && walk(assigned) == L"A B C ");
+  assigned = std::as_const(assigned);
+  EXPECT_EQ(3, assigned.getNumberOfObjects());
+  const DexObjectList empty;
+  empty.reset();
+  EXPECT_TRUE(empty.getNextObjectInTheList() == nullptr && empty.findObjectInTheList(L"") == nullptr);
 }
 
-TEST_F(DexOwningListTest, FindFirstAndIndexOfAnswerTheFirstMatch) {
-  DexOwningList<Counted> list;
-  list.add(new Counted(1));
-  list.add(new Counted(2));
-  list.add(new Counted(2));
-  Counted* const found = list.findFirst([](const Counted& item) { return item.value() == 2; });
-  EXPECT_EQ(list.at(1), found);
-  EXPECT_EQ(nullptr, list.findFirst([](const Counted& item) { return item.value() == 5; }));
-  EXPECT_EQ(1, list.indexOf(found));
-  const Counted outsider(2);
-  EXPECT_EQ(-1, list.indexOf(&outsider));
-  EXPECT_EQ(-1, list.indexOf(nullptr));
-}
+}  // namespace

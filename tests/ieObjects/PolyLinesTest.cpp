@@ -16,21 +16,10 @@
 
 namespace {
 
+using namespace vyn::ie;
 using objects_test::codeOf;
-using objects_test::CountedAreaProperties;
-using objects_test::linePropertiesOf;
+using objects_test::Counted;
 using objects_test::stationAt;
-using vyn::ie::CS_GEOGRAPHIC;
-using vyn::ie::CS_GRID;
-using vyn::ie::DexArea;
-using vyn::ie::DexBreakline;
-using vyn::ie::DexCodeDescription;
-using vyn::ie::DexDesignPoint;
-using vyn::ie::DexDrawAreaProperties;
-using vyn::ie::DexDrawPointProperties;
-using vyn::ie::DexPolyLine;
-using vyn::ie::DexPosition3D;
-using vyn::ie::DexStation;
 namespace detail = vyn::ie::detail;
 
 const std::wstring kSource = detail::kObjectsLogSource;
@@ -43,312 +32,126 @@ DexPolyLine lineThrough(std::initializer_list<double> xs) {
   return line;
 }
 
-// A design point carrying one code (of description, may be null) with the given code strings.
-void addCode(DexDesignPoint& point, const DexCodeDescription* description,
-             std::initializer_list<const wchar_t*> codeStrings) {
-  point.addCode(codeOf(description, codeStrings));
+// How many stations remain of two added at (x, y, z) of the given kind.
+int stationsOfTwo(DexPosition3D first, DexPosition3D second, EDexCSType firstKind, EDexCSType secondKind) {
+  DexPolyLine line(false);
+  line.addStation(stationAt(first.getX(), first.getY(), first.getZ(), L"", 0.0, firstKind));
+  line.addStation(stationAt(second.getX(), second.getY(), second.getZ(), L"", 0.0, secondKind));
+  return line.getNumberOfStations();
 }
-
-// Three design points and a point-mode polyline named A1 through them.
-struct CodeStringFixture {
-  DexCodeDescription fence{L"FENCE"};
-  DexDesignPoint points[3];
-  DexPolyLine line{true};
-
-  CodeStringFixture() {
-    line.setName(L"A1");
-    for (DexDesignPoint& point : points)
-      line.addPoint(&point, 0.0);
-  }
-};
 
 }  // namespace
 
 static_assert(sizeof(DexBreakline::EDexBreaklineType) == 4);
 
-// ---- Modes and defaults -------------------------------------------------------------------------
-
 TEST(DexPolyLine, StartsOpenWithoutVerticesInTheGivenMode) {
-  const DexPolyLine stations(false);
-  const DexPolyLine points(true);
-  EXPECT_FALSE(stations.isClosed());
-  EXPECT_FALSE(stations.isUsingPoints());
-  EXPECT_TRUE(points.isUsingPoints());
-  EXPECT_EQ(0, stations.getNumberOfNodes());
-  EXPECT_EQ(nullptr, stations.getLastStation());
-  EXPECT_TRUE(stations.getName().IsEmpty());
-  EXPECT_TRUE(stations.getId().IsEmpty());
-}
-
-TEST(DexArea, StartsClosed) {
+  DexPolyLine line(false);
+  EXPECT_TRUE(!line.isClosed() && !line.isUsingPoints() && DexPolyLine(true).isUsingPoints());
+  EXPECT_TRUE(line.getNumberOfNodes() == 0 && line.getLastStation() == nullptr && line.getId().IsEmpty());
   const DexArea area(false);
-  EXPECT_TRUE(area.isClosed());
-  EXPECT_EQ(nullptr, area.getAreaDrawProperties());
-  EXPECT_TRUE(DexArea(true).isUsingPoints());
-}
-
-TEST(DexPolyLine, KeepsNameIdAndCloseStatus) {
-  DexPolyLine line(false);
-  line.setName(L"L1");
+  EXPECT_TRUE(area.isClosed() && area.getAreaDrawProperties() == nullptr && DexArea(true).isUsingPoints());
   line.setId(L"guid-1");
-  line.setCloseStatus(true);
-  EXPECT_EQ(L"L1", line.getName());
   EXPECT_EQ(L"guid-1", line.getId());
-  EXPECT_TRUE(line.isClosed());
-}
-
-// ---- Adding stations ----------------------------------------------------------------------------
-
-TEST(DexPolyLine, AddingTheSameStationTwiceKeepsOneVertex) {
-  DexPolyLine line(false);
-  line.addStation(stationAt(1.0, 2.0, 3.0));
-  line.addStation(stationAt(1.0, 2.0, 3.0));
-  EXPECT_EQ(1, line.getNumberOfStations());
-}
-
-TEST(DexPolyLine, ARepeatedVertexWithABulgeReplacesTheLastOne) {
-  DexPolyLine line(false);
-  line.addStation(stationAt(1.0, 2.0, 3.0, L"first"));
-  line.addStation(stationAt(1.0, 2.0, 3.0, L"again", 0.5));
-  ASSERT_EQ(1, line.getNumberOfStations());
-  EXPECT_EQ(0.5, line.getStation(0).getBulge());
-  EXPECT_EQ(L"again", line.getStation(0).getName());
-}
-
-TEST(DexPolyLine, ARepeatedVertexWithoutBulgeIsDroppedKeepingTheLastOnesBulge) {
-  DexPolyLine line(false);
-  line.addStation(stationAt(1.0, 2.0, 3.0, L"first", 0.25));
-  line.addStation(stationAt(1.0, 2.0, 3.0, L"again"));
-  ASSERT_EQ(1, line.getNumberOfStations());
-  EXPECT_EQ(0.25, line.getStation(0).getBulge());
-  EXPECT_EQ(L"first", line.getStation(0).getName());
-}
-
-TEST(DexPolyLine, OnlyTheLastStationIsComparedWhenAdding) {
-  const DexPolyLine line = lineThrough({1.0, 2.0, 1.0});
-  EXPECT_EQ(3, line.getNumberOfStations());
-}
-
-TEST(DexPolyLine, StationsCloserThanAMillimetreTenthMergeUnlessGeographic) {
-  DexPolyLine grid(false);
-  grid.addStation(stationAt(100.0, 0.0, 0.0, L"", 0.0, CS_GRID));
-  grid.addStation(stationAt(100.00005, 0.0, 0.0, L"", 0.0, CS_GRID));
-  EXPECT_EQ(1, grid.getNumberOfStations());
-
-  DexPolyLine geographic(false);
-  geographic.addStation(stationAt(100.0, 0.0, 0.0, L"", 0.0, CS_GEOGRAPHIC));
-  geographic.addStation(stationAt(100.00005, 0.0, 0.0, L"", 0.0, CS_GEOGRAPHIC));
-  EXPECT_EQ(2, geographic.getNumberOfStations());
-}
-
-TEST(DexPolyLine, MergeToleranceFollowsTheAddedStationsKind) {
-  DexPolyLine line(false);
-  line.addStation(stationAt(10.0, 0.0, 0.0, L"", 0.0, CS_GEOGRAPHIC));
-  line.addStation(stationAt(10.00005, 0.0, 0.0, L"", 0.0, CS_GRID));
-  EXPECT_EQ(1, line.getNumberOfStations());
-}
-
-TEST(DexPolyLine, StationsJustOutsideTheToleranceStayApart) {
-  for (const double dz : {0.0001, 0.00011, -0.00011}) {
-    DexPolyLine line(false);
-    line.addStation(stationAt(0.0, 0.0, 0.0));
-    line.addStation(stationAt(0.0, 0.0, dz));
-    EXPECT_EQ(2, line.getNumberOfStations()) << dz;
-  }
-  DexPolyLine inside(false);
-  inside.addStation(stationAt(0.0, 0.0, 0.0));
-  inside.addStation(stationAt(0.0, -0.000099, 0.0));
-  EXPECT_EQ(1, inside.getNumberOfStations());
-}
-
-TEST(DexPolyLine, GeographicStationsMergeOnlyWithinNineNanodegrees) {
-  DexPolyLine inside(false);
-  inside.addStation(stationAt(48.0, 11.0, 500.0, L"", 0.0, CS_GEOGRAPHIC));
-  inside.addStation(stationAt(48.0, 11.0 + 8e-9, 500.0, L"", 0.0, CS_GEOGRAPHIC));
-  EXPECT_EQ(1, inside.getNumberOfStations());
-
-  DexPolyLine outside(false);
-  outside.addStation(stationAt(48.0, 11.0, 500.0, L"", 0.0, CS_GEOGRAPHIC));
-  outside.addStation(stationAt(48.0, 11.0 + 1e-8, 500.0, L"", 0.0, CS_GEOGRAPHIC));
-  EXPECT_EQ(2, outside.getNumberOfStations());
-
-  DexPolyLine onTheTolerance(false);
-  onTheTolerance.addStation(stationAt(0.0, 0.0, 0.0, L"", 0.0, CS_GEOGRAPHIC));
-  onTheTolerance.addStation(stationAt(9e-9, 0.0, 0.0, L"", 0.0, CS_GEOGRAPHIC));
-  EXPECT_EQ(2, onTheTolerance.getNumberOfStations());
-}
-
-// ---- Station access -----------------------------------------------------------------------------
-
-TEST(DexPolyLine, GetStationOutsideTheListLogsAndAnswersTheSharedDefaultStation) {
-  const DexPolyLine line = lineThrough({1.0, 2.0});
-  const DexPolyLine other(true);
-  const dex_test::LogCapture log;
-  const DexStation& past = line.getStation(2);
-  const DexStation& negative = line.getStation(-1);
-  const DexStation& fromOther = other.getStation(0);
-  EXPECT_EQ(&past, &negative);
-  EXPECT_EQ(&past, &fromOther);
-  EXPECT_EQ(DexPosition3D(0.0, 0.0, 0.0), past);
-  EXPECT_TRUE(past.getName().IsEmpty());
-  EXPECT_EQ(3, log.count(kSource, detail::kPolyLineStationIndexLine));
-  EXPECT_EQ(3u, log.size());
-  EXPECT_TRUE(log.records()[0].message.empty());
-}
-
-TEST(DexPolyLine, GetStationInsideTheListDoesNotLog) {
-  const DexPolyLine line = lineThrough({1.0, 2.0});
-  const dex_test::LogCapture log;
-  EXPECT_EQ(1.0, line.getStation(0).getX());
-  EXPECT_EQ(2.0, line.getStation(1).getX());
-  EXPECT_EQ(0u, log.size());
-}
-
-TEST(DexPolyLine, LastStationIsTheLastAdded) {
-  DexPolyLine line = lineThrough({1.0, 2.0});
-  ASSERT_NE(nullptr, line.getLastStation());
-  EXPECT_EQ(2.0, line.getLastStation()->getX());
-  EXPECT_EQ(2.0, std::as_const(line).getLastStation()->getX());
-}
-
-TEST(DexPolyLine, ChangeStationAssignsOnlyExistingStations) {
-  DexPolyLine line = lineThrough({1.0, 2.0});
-  EXPECT_TRUE(line.changeStation(0, stationAt(5.0, 5.0, 5.0, L"X")));
-  EXPECT_EQ(L"X", line.getStation(0).getName());
-  EXPECT_FALSE(line.changeStation(2, stationAt(6.0, 0.0, 0.0)));
-  EXPECT_FALSE(line.changeStation(-1, stationAt(6.0, 0.0, 0.0)));
-  EXPECT_TRUE(line.changeLastStation(stationAt(7.0, 0.0, 0.0)));
-  EXPECT_EQ(7.0, line.getStation(1).getX());
-  EXPECT_EQ(2, line.getNumberOfStations());
-
-  DexPolyLine empty(false);
-  EXPECT_FALSE(empty.changeLastStation(stationAt(7.0, 0.0, 0.0)));
-  EXPECT_EQ(0, empty.getNumberOfStations());
-}
-
-TEST(DexPolyLine, RemoveStationClosesTheGapAndRefusesBadIndexes) {
-  DexPolyLine line = lineThrough({1.0, 2.0, 3.0});
-  EXPECT_FALSE(line.removeStation(3));
-  EXPECT_FALSE(line.removeStation(-1));
-  EXPECT_TRUE(line.removeStation(1));
-  ASSERT_EQ(2, line.getNumberOfStations());
-  EXPECT_EQ(3.0, line.getStation(1).getX());
-
-  DexPolyLine empty(false);
-  EXPECT_FALSE(empty.removeStation(0));
-}
-
-TEST(DexPolyLine, ReservingRoomAddsNoStation) {
-  DexPolyLine line(false);
   line.reserveNumberOfStations(1000);
   line.reserveNumberOfStations(-5);
   EXPECT_EQ(0, line.getNumberOfStations());
 }
 
-// ---- Point mode ---------------------------------------------------------------------------------
-
-TEST(DexPolyLine, NodesFollowTheMode) {
-  DexDesignPoint a;
-  DexDesignPoint b;
-  DexDesignPoint c;
-  DexPolyLine line(true);
-  line.addPoint(&a, 0.0);
-  line.addPoint(&b, 0.5);
-  line.addPoint(&c, 0.0);
-  EXPECT_EQ(3, line.getNumberOfNodes());
-  EXPECT_EQ(3, line.getNumberOfPoints());
-  EXPECT_EQ(0, line.getNumberOfStations());
-
-  const DexPolyLine stations = lineThrough({1.0, 2.0});
-  EXPECT_EQ(2, stations.getNumberOfNodes());
-  EXPECT_EQ(0, stations.getNumberOfPoints());
+TEST(DexPolyLine, ARepeatedLastVertexMergesKeepingTheBulge) {
+  DexPolyLine line(false);
+  line.addStation(stationAt(1.0, 2.0, 3.0, L"first"));
+  line.addStation(stationAt(1.0, 2.0, 3.0, L"first"));
+  line.addStation(stationAt(1.0, 2.0, 3.0, L"again", 0.5));  // with a bulge it replaces the last one
+  ASSERT_EQ(1, line.getNumberOfStations());
+  EXPECT_TRUE(line.getStation(0).getBulge() == 0.5 && line.getStation(0).getName() == L"again");
+  line.addStation(stationAt(1.0, 2.0, 3.0, L"third"));  // without, it is dropped
+  EXPECT_TRUE(line.getNumberOfStations() == 1 && line.getStation(0).getName() == L"again");
+  EXPECT_EQ(3, lineThrough({1.0, 2.0, 1.0}).getNumberOfStations());  // only the last one is compared
 }
 
-TEST(DexPolyLine, PointEntriesAreNeverMerged) {
-  DexDesignPoint a;
-  DexPolyLine line(true);
-  line.addPoint(&a, 0.0);
-  line.addPoint(&a, 0.0);
-  line.addPoint(nullptr, 0.0);
-  EXPECT_EQ(3, line.getNumberOfPoints());
-  EXPECT_EQ(&a, line.getPoint(1));
-  EXPECT_EQ(nullptr, line.getPoint(2));
+TEST(DexPolyLine, MergeToleranceIsATenthOfAMillimetreOrNineNanodegrees) {
+  const struct {
+    DexPosition3D first, second;
+    EDexCSType firstKind, secondKind;
+    int stations;
+  } rows[] = {{{100, 0, 0}, {100.00005, 0, 0}, CS_GRID, CS_GRID, 1},
+              {{100, 0, 0}, {100.00005, 0, 0}, CS_GEOGRAPHIC, CS_GEOGRAPHIC, 2},
+              {{10, 0, 0}, {10.00005, 0, 0}, CS_GEOGRAPHIC, CS_GRID, 1},  // the added station's kind
+              {{0, 0, 0}, {0, 0, 0.0001}, CS_LOCAL, CS_LOCAL, 2},
+              {{0, 0, 0}, {0, 0, -0.00011}, CS_LOCAL, CS_LOCAL, 2},
+              {{0, 0, 0}, {0, -0.000099, 0}, CS_LOCAL, CS_LOCAL, 1},
+              {{48, 11, 500}, {48, 11 + 8e-9, 500}, CS_GEOGRAPHIC, CS_GEOGRAPHIC, 1},
+              {{48, 11, 500}, {48, 11 + 1e-8, 500}, CS_GEOGRAPHIC, CS_GEOGRAPHIC, 2},
+              {{0, 0, 0}, {9e-9, 0, 0}, CS_GEOGRAPHIC, CS_GEOGRAPHIC, 2}};
+  for (const auto& row : rows)
+    EXPECT_EQ(row.stations, stationsOfTwo(row.first, row.second, row.firstKind, row.secondKind))
+        << row.second.getX() << " " << row.second.getY() << " " << row.second.getZ();
 }
 
-TEST(DexPolyLine, PointAccessOutsideTheListAnswersNull) {
-  DexDesignPoint a;
-  DexPolyLine line(true);
-  line.addPoint(&a, 0.25);
-  EXPECT_EQ(&a, line.getPoint(0));
-  ASSERT_NE(nullptr, line.getPointEntry(0));
-  EXPECT_EQ(0.25, line.getPointEntry(0)->bulge);
-  for (const int index : {1, -1, INT_MAX}) {
-    EXPECT_EQ(nullptr, line.getPoint(index));
-    EXPECT_EQ(nullptr, line.getPointEntry(index));
-  }
+TEST(DexPolyLine, StationsOutsideTheListAreLoggedAndTheSharedDefault) {
+  DexPolyLine line = lineThrough({1.0, 2.0});
+  const DexPolyLine other(true);
+  const dex_test::LogCapture log;
+  EXPECT_TRUE(line.getStation(0).getX() == 1.0 && std::as_const(line).getLastStation()->getX() == 2.0);
+  EXPECT_EQ(0u, log.size());
+  const DexStation& past = line.getStation(2);
+  EXPECT_TRUE(&past == &line.getStation(-1) && &past == &other.getStation(0));
+  EXPECT_TRUE(past == DexPosition3D(0.0, 0.0, 0.0) && past.getName().IsEmpty());
+  EXPECT_EQ(3, log.count(kSource, detail::kPolyLineStationIndexLine));
+  EXPECT_TRUE(log.size() == 3u && log.records()[0].message.empty());
 }
 
-TEST(DexPolyLine, RemovePointRemovesTheEntryButNotThePoint) {
+TEST(DexPolyLine, ChangesAndRemovesOnlyExistingStations) {
+  DexPolyLine line = lineThrough({1.0, 2.0, 3.0});
+  EXPECT_TRUE(line.changeStation(0, stationAt(5.0, 5.0, 5.0, L"X")));
+  EXPECT_FALSE(line.changeStation(3, stationAt(6.0, 0.0, 0.0)) ||
+               line.changeStation(-1, stationAt(6.0, 0.0, 0.0)));
+  EXPECT_TRUE(line.changeLastStation(stationAt(7.0, 0.0, 0.0)));
+  EXPECT_TRUE(line.getStation(0).getName() == L"X" && line.getStation(2).getX() == 7.0);
+  EXPECT_FALSE(line.removeStation(3) || line.removeStation(-1));
+  EXPECT_TRUE(line.removeStation(1));
+  EXPECT_TRUE(line.getNumberOfStations() == 2 && line.getStation(1).getX() == 7.0);
+  DexPolyLine empty(false);
+  EXPECT_FALSE(empty.changeLastStation(stationAt(7.0, 0.0, 0.0)) || empty.removeStation(0));
+  EXPECT_EQ(0, empty.getNumberOfStations());
+}
+
+TEST(DexPolyLine, PointModeKeepsEveryEntryAndReadsNodesInEitherMode) {
   DexDesignPoint a;
   DexDesignPoint b;
   a.setName(L"A");
-  DexPolyLine line(true);
-  EXPECT_FALSE(line.removePoint(0));
-  line.addPoint(&a, 0.0);
-  line.addPoint(&b, 0.0);
-  EXPECT_FALSE(line.removePoint(2));
-  EXPECT_TRUE(line.removePoint(0));
-  EXPECT_EQ(1, line.getNumberOfPoints());
-  EXPECT_EQ(&b, line.getPoint(0));
-  EXPECT_EQ(L"A", a.getName());
-}
-
-TEST(DexPolyLine, NodeStationsAndBulgesReadEitherMode) {
-  DexDesignPoint a;
   a.setCoords(5.0, 6.0, 7.0);
   DexPolyLine points(true);
-  points.addPoint(&a, 0.75);
-  EXPECT_EQ(&a.getStation(), &points.getNodeStation(0));
-  EXPECT_EQ(0.75, points.getNodeBulge(0));
+  EXPECT_FALSE(points.removePoint(0));
+  for (DexDesignPoint* point : {&a, &a, &b, static_cast<DexDesignPoint*>(nullptr)})
+    points.addPoint(point, 0.75);
+  EXPECT_TRUE(points.getNumberOfNodes() == 4 && points.getNumberOfPoints() == 4 &&
+              points.getNumberOfStations() == 0);
+  EXPECT_TRUE(points.getPoint(1) == &a && points.getPoint(3) == nullptr &&
+              points.getPointEntry(0)->bulge == 0.75);
+  for (const int index : {4, -1, INT_MAX})
+    EXPECT_TRUE(points.getPoint(index) == nullptr && points.getPointEntry(index) == nullptr) << index;
+  EXPECT_TRUE(&points.getNodeStation(0) == &a.getStation() && points.getNodeBulge(0) == 0.75);
   EXPECT_TRUE(points.setNodeBulge(0, -0.5));
-  EXPECT_EQ(-0.5, points.getPointEntry(0)->bulge);
-  EXPECT_EQ(0.0, a.getStation().getBulge());
-
+  EXPECT_TRUE(points.getPointEntry(0)->bulge == -0.5 && a.getStation().getBulge() == 0.0);
+  EXPECT_FALSE(points.removePoint(4));
+  EXPECT_TRUE(points.removePoint(0));  // the entry goes, not the point
+  EXPECT_TRUE(points.getNumberOfPoints() == 3 && a.getName() == L"A");
   DexPolyLine stations(false);
   stations.addStation(stationAt(1.0, 0.0, 0.0, L"", 0.1));
-  EXPECT_EQ(1.0, stations.getNodeStation(0).getX());
-  EXPECT_EQ(0.1, stations.getNodeBulge(0));
-  EXPECT_TRUE(stations.setNodeBulge(0, 0.2));
-  EXPECT_EQ(0.2, stations.getStation(0).getBulge());
-}
-
-TEST(DexPolyLine, NodeAccessOutsideTheNodesNeverCrashes) {
-  DexDesignPoint a;
-  DexPolyLine points(true);
-  points.addPoint(&a, 0.0);
-  points.addStation(stationAt(1.0, 0.0, 0.0));
-  DexPolyLine stations = lineThrough({1.0});
-  const dex_test::LogCapture log;
-  const DexStation* const defaultStation = &points.getNodeStation(1);
-  EXPECT_EQ(DexPosition3D(0.0, 0.0, 0.0), *defaultStation);
-  EXPECT_EQ(defaultStation, &stations.getNodeStation(1));
-  EXPECT_EQ(defaultStation, &stations.getNodeStation(INT_MIN));
+  EXPECT_TRUE(stations.getNodeStation(0).getX() == 1.0 && stations.getNodeBulge(0) == 0.1 &&
+              stations.getNumberOfPoints() == 0);
+  EXPECT_TRUE(stations.setNodeBulge(0, 0.2) && stations.getStation(0).getBulge() == 0.2);
+  const dex_test::LogCapture log;  // outside the nodes: logged, the default station, no bulge
+  const DexStation* const fallback = &stations.getNodeStation(1);
+  EXPECT_TRUE(*fallback == DexPosition3D(0.0, 0.0, 0.0) && fallback == &points.getNodeStation(3) &&
+              fallback == &stations.getNodeStation(INT_MIN) && points.getNodeStation(2) == *fallback);
   EXPECT_EQ(3, log.count(kSource, detail::kPolyLineNodeIndexLine));
-  EXPECT_EQ(3u, log.size());
-  EXPECT_EQ(0.0, points.getNodeBulge(1));
-  EXPECT_EQ(0.0, stations.getNodeBulge(-1));
-  EXPECT_FALSE(points.setNodeBulge(1, 1.0));
-  EXPECT_FALSE(stations.setNodeBulge(1, 1.0));
-}
-
-TEST(DexPolyLine, NodeStationOfAnEntryWithoutPointIsLoggedAndTheDefault) {
-  DexPolyLine line(true);
-  line.addPoint(nullptr, 0.5);
-  const dex_test::LogCapture log;
-  const DexStation& station = line.getNodeStation(0);
-  EXPECT_EQ(DexPosition3D(0.0, 0.0, 0.0), station);
-  EXPECT_EQ(1, log.count(kSource, detail::kPolyLineNodeWithoutPointLine));
-  EXPECT_EQ(0.5, line.getNodeBulge(0));
+  EXPECT_EQ(1, log.count(kSource, detail::kPolyLineNodeWithoutPointLine));  // the entry without point
+  EXPECT_EQ(4u, log.size());
+  EXPECT_TRUE(points.getNodeBulge(2) == 0.75 && points.getNodeBulge(3) == 0.0 &&
+              stations.getNodeBulge(-1) == 0.0);
+  EXPECT_FALSE(points.setNodeBulge(3, 1.0) || stations.setNodeBulge(1, 1.0));
 }
 
 TEST(DexPolyLine, ShiftMovesOwnStationsButNotReferencedPoints) {
@@ -362,49 +165,37 @@ TEST(DexPolyLine, ShiftMovesOwnStationsButNotReferencedPoints) {
   EXPECT_EQ(DexPosition3D(1.0, 1.0, 1.0), a.getStation());
 }
 
-// ---- Drawing properties -------------------------------------------------------------------------
-
-TEST(DexPolyLine, DrawLinePropertiesReadTheLineFormOnly) {
+TEST(DexPolyLine, DrawPropertiesOfLinesAndAreas) {
   DexPolyLine line(false);
   EXPECT_EQ(nullptr, line.getDrawLineProperties());
-  line.setDrawProperties(linePropertiesOf(0xFF));
-  ASSERT_NE(nullptr, line.getDrawLineProperties());
-  EXPECT_EQ(line.getDrawProperties(), std::as_const(line).getDrawLineProperties());
-  line.setDrawProperties(new DexDrawPointProperties());
-  EXPECT_EQ(nullptr, line.getDrawLineProperties());
-  EXPECT_EQ(nullptr, std::as_const(line).getDrawLineProperties());
-}
-
-TEST(DexArea, AreaDrawPropertiesAreOwnedAndReplacedOnesDeleted) {
+  line.setDrawProperties(objects_test::linePropertiesOf(0xFF));
+  EXPECT_TRUE(line.getDrawLineProperties() != nullptr &&
+              line.getDrawProperties() == std::as_const(line).getDrawLineProperties());
+  line.setDrawProperties(new DexDrawPointProperties());  // the line form only
+  EXPECT_TRUE(line.getDrawLineProperties() == nullptr &&
+              std::as_const(line).getDrawLineProperties() == nullptr);
   int deletions = 0;
-  auto* const first = new CountedAreaProperties(deletions);
+  auto* const first = new Counted<DexDrawAreaProperties>(deletions);
   {
     DexArea area(false);
     area.setAreaDrawProperties(first);
     area.setAreaDrawProperties(first);
-    EXPECT_EQ(0, deletions);
-    EXPECT_EQ(first, area.getAreaDrawProperties());
-    area.setAreaDrawProperties(new CountedAreaProperties(deletions));
+    EXPECT_TRUE(deletions == 0 && area.getAreaDrawProperties() == first);
+    area.setAreaDrawProperties(new Counted<DexDrawAreaProperties>(deletions));
     EXPECT_EQ(1, deletions);
   }
   EXPECT_EQ(2, deletions);
 }
 
-// ---- Breaklines ---------------------------------------------------------------------------------
-
 TEST(DexBreakline, IsAStationModeLineOfItsSurface) {
   DexBreakline breakline(L"Ground");
-  EXPECT_FALSE(breakline.isUsingPoints());
-  EXPECT_FALSE(breakline.isClosed());
-  EXPECT_EQ(L"Ground", breakline.getSurfaceName());
-  EXPECT_EQ(0, breakline.getBreaklineType());
+  EXPECT_TRUE(!breakline.isUsingPoints() && !breakline.isClosed() &&
+              breakline.getSurfaceName() == L"Ground" && breakline.getBreaklineType() == 0);
   breakline.setBreaklineType(DexBreakline::BREAKLINE_SOFT);
   EXPECT_EQ(1, breakline.getBreaklineType());
   breakline.setBreaklineType(42);
   EXPECT_EQ(42, breakline.getBreaklineType());
-}
-
-TEST(DexBreakline, SurfaceNameIsTheOneOperationItAddsToTheVirtualTable) {
+  // The surface name is the one operation it adds to the virtual table.
   const auto surfaceName = dex_test::vtableEntryOf(&DexBreakline::getSurfaceName);
   const auto lastOfPolyLine = dex_test::vtableEntryOf(&DexPolyLine::getId);
   if (!surfaceName || !lastOfPolyLine) GTEST_SKIP() << "virtual table layout not observable on this platform";
@@ -412,94 +203,49 @@ TEST(DexBreakline, SurfaceNameIsTheOneOperationItAddsToTheVirtualTable) {
   EXPECT_EQ(*lastOfPolyLine + 1, *surfaceName);
 }
 
-// ---- Code strings -------------------------------------------------------------------------------
-
+// A point-mode line is a code string when each of its points carries its name as a code string (the
+// first may carry it as code name and string); any code of a point may carry it.
 TEST(DexPolyLine, PointsCarryingTheNameAsCodeStringMakeACodeString) {
-  CodeStringFixture fixture;
-  for (DexDesignPoint& point : fixture.points)
-    addCode(point, &fixture.fence, {L"A1"});
-  EXPECT_TRUE(fixture.line.isCodeString());
-}
-
-TEST(DexPolyLine, AMiddlePointWithAnotherCodeStringBreaksTheCodeString) {
-  CodeStringFixture fixture;
-  addCode(fixture.points[0], &fixture.fence, {L"A1"});
-  addCode(fixture.points[1], &fixture.fence, {L"A2"});
-  addCode(fixture.points[2], &fixture.fence, {L"A1"});
-  EXPECT_FALSE(fixture.line.isCodeString());
-}
-
-TEST(DexPolyLine, AnyCodeOfAPointMayCarryTheCodeString) {
-  CodeStringFixture fixture;
-  const DexCodeDescription tree(L"TREE");
-  for (DexDesignPoint& point : fixture.points) {
-    addCode(point, &tree, {L"X"});
-    addCode(point, &fixture.fence, {L"B", L"A1"});
-  }
-  EXPECT_TRUE(fixture.line.isCodeString());
-}
-
-TEST(DexPolyLine, TheFirstPointMayCarryTheNameAsCodeNameAndStringButNotTheOthers) {
-  CodeStringFixture fixture;
-  fixture.line.setName(L"FENCE7");
-  addCode(fixture.points[0], &fixture.fence, {L"7"});
-  addCode(fixture.points[1], &fixture.fence, {L"FENCE7"});
-  addCode(fixture.points[2], &fixture.fence, {L"FENCE7"});
-  EXPECT_TRUE(fixture.line.isCodeString());
-  fixture.points[2].removeAllCodes();
-  addCode(fixture.points[2], &fixture.fence, {L"7"});
-  EXPECT_FALSE(fixture.line.isCodeString());
-}
-
-TEST(DexPolyLine, CodeStringsCompareExactly) {
-  CodeStringFixture fixture;
-  for (DexDesignPoint& point : fixture.points)
-    addCode(point, &fixture.fence, {L"a1"});
-  EXPECT_FALSE(fixture.line.isCodeString());
-}
-
-TEST(DexPolyLine, APointWithoutCodesBreaksTheCodeString) {
-  CodeStringFixture fixture;
-  addCode(fixture.points[0], &fixture.fence, {L"A1"});
-  addCode(fixture.points[2], &fixture.fence, {L"A1"});
-  EXPECT_FALSE(fixture.line.isCodeString());
-  CodeStringFixture firstWithout;
-  addCode(firstWithout.points[1], &firstWithout.fence, {L"A1"});
-  addCode(firstWithout.points[2], &firstWithout.fence, {L"A1"});
-  EXPECT_FALSE(firstWithout.line.isCodeString());
-}
-
-TEST(DexPolyLine, ASinglePointCarryingTheNameIsACodeString) {
-  DexDesignPoint point;
   const DexCodeDescription fence(L"FENCE");
-  addCode(point, &fence, {L"A1"});
-  DexPolyLine line(true);
-  line.setName(L"A1");
-  line.addPoint(&point, 0.0);
-  EXPECT_TRUE(line.isCodeString());
-}
-
-TEST(DexPolyLine, StationModeOrNoPointsIsNoCodeString) {
-  DexPolyLine stations(false);
-  stations.addStation(stationAt(1.0, 0.0, 0.0));
-  EXPECT_FALSE(stations.isCodeString());
-  const DexPolyLine empty(true);
-  EXPECT_FALSE(empty.isCodeString());
-}
-
-TEST(DexPolyLine, MissingPointsAndCodesWithoutDescriptionNeverCrashTheCodeStringTest) {
-  DexDesignPoint point;
-  addCode(point, nullptr, {L"A1"});
+  const DexCodeDescription tree(L"TREE");
+  using Strings = std::initializer_list<const wchar_t*>;
+  const struct {
+    const wchar_t* name;
+    Strings first, middle, last;
+    bool tree, codeString;
+  } rows[] = {{L"A1", {L"A1"}, {L"A1"}, {L"A1"}, false, true},
+              {L"A1", {L"A1"}, {L"A2"}, {L"A1"}, false, false},
+              {L"A1", {L"B", L"A1"}, {L"B", L"A1"}, {L"B", L"A1"}, true, true},
+              {L"FENCE7", {L"7"}, {L"FENCE7"}, {L"FENCE7"}, false, true},
+              {L"FENCE7", {L"7"}, {L"FENCE7"}, {L"7"}, false, false},
+              {L"A1", {L"a1"}, {L"a1"}, {L"a1"}, false, false},
+              {L"A1", {L"A1"}, {}, {L"A1"}, false, false},
+              {L"A1", {}, {L"A1"}, {L"A1"}, false, false}};
+  int rowNumber = 0;
+  for (const auto& row : rows) {
+    DexDesignPoint points[3];
+    DexPolyLine line(true);
+    line.setName(row.name);
+    const Strings* const strings[] = {&row.first, &row.middle, &row.last};
+    for (int i = 0; i < 3; ++i) {
+      if (row.tree) points[i].addCode(codeOf(&tree, {L"X"}));
+      if (strings[i]->size() > 0) points[i].addCode(codeOf(&fence, *strings[i]));
+      line.addPoint(&points[i], 0.0);
+    }
+    EXPECT_EQ(row.codeString, line.isCodeString()) << "row " << rowNumber++;
+  }
+  DexDesignPoint point;  // one point; codes without description and missing points never crash
+  point.addCode(codeOf(nullptr, {L"A1"}));
   DexPolyLine line(true);
   line.setName(L"A1");
   line.addPoint(&point, 0.0);
   EXPECT_TRUE(line.isCodeString());
   line.addPoint(nullptr, 0.0);
   EXPECT_FALSE(line.isCodeString());
-
   DexPolyLine nullFirst(true);
   nullFirst.setName(L"A1");
   nullFirst.addPoint(nullptr, 0.0);
   nullFirst.addPoint(&point, 0.0);
-  EXPECT_FALSE(nullFirst.isCodeString());
+  EXPECT_FALSE(nullFirst.isCodeString() || DexPolyLine(true).isCodeString() ||
+               lineThrough({1.0}).isCodeString());
 }

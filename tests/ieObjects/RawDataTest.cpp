@@ -88,38 +88,34 @@ std::unique_ptr<DexRawData> searchJob() {
               new TestLevelRecord(L"L"), named<DexRawNote>(L"B"), new TestLevelRecord(L"A")}));
 }
 
-TEST(DexRawData, FindRawDataAnswersTheLastMatchOfKindNameAndState) {
+TEST(DexRawData, FindRawDataAnswersTheLastMatchAndFindFirstRawDataTheFirst) {
   struct Case {
-    int type;
     const wchar_t* name;
+    int type;
     bool onlyActive;
     bool lastOnly;
     int expected;  // index in searchJob(), -1 for none
+    int first;     // the index findFirstRawData answers (it has no lastOnly)
   };
   const Case cases[] = {
-      {0, L"B", true, false, 2},    {0, L"B", false, false, 2},  {4, L"B", false, false, 2},
-      {3, L"B", false, false, -1},  {0, L"b", false, false, -1}, {0, L"A", true, false, -1},
-      {0, L"A", false, false, 0},   {1, L"G", false, false, 3},  {2, L"G", false, false, -1},
-      {4, L"G", false, false, 3},   {1, L"G4", false, false, 4}, {2, L"G4", false, false, 4},
-      {0, L"G4", false, false, -1}, {2, L"L", false, false, 5},  {1, L"L", false, false, -1},
-      {4, L"A", false, false, 7},   {0, L"A", false, true, -1},  {2, L"A", false, true, 7},
-      {0, L"B", false, true, -1},   {9, L"A", false, false, -1},
+      {L"B", 0, true, false, 2, 2},     {L"B", 0, false, false, 2, 1},   {L"B", 4, false, false, 2, 1},
+      {L"B", 3, false, false, -1, -1},  {L"b", 0, false, false, -1, -1}, {L"A", 0, true, false, -1, -1},
+      {L"A", 0, false, false, 0, 0},    {L"G", 1, false, false, 3, 3},   {L"G", 2, false, false, -1, -1},
+      {L"G", 4, false, false, 3, 3},    {L"G4", 1, false, false, 4, 4},  {L"G4", 2, false, false, 4, 4},
+      {L"G4", 0, false, false, -1, -1}, {L"L", 2, false, false, 5, 5},   {L"L", 1, false, false, -1, -1},
+      {L"A", 4, false, false, 7, 0},    {L"A", 0, false, true, -1, 0},   {L"A", 2, false, true, 7, 7},
+      {L"B", 0, false, true, -1, 1},    {L"A", 9, false, false, -1, -1},
   };
   const auto job = searchJob();
+  const auto at = [&job](const IDexRawDataInterface* found) {
+    return found != nullptr ? indexOf(*job, found) : -1;
+  };
   for (const Case& c : cases) {
-    const IDexRawDataInterface* const found =
-        job->findRawData(static_cast<Kind>(c.type), c.name, c.onlyActive, c.lastOnly);
-    EXPECT_EQ(c.expected, found != nullptr ? indexOf(*job, found) : -1)
+    const auto kind = static_cast<Kind>(c.type);
+    EXPECT_EQ(c.expected, at(job->findRawData(kind, c.name, c.onlyActive, c.lastOnly)))
         << c.type << " " << c.name << " " << c.onlyActive << c.lastOnly;
+    EXPECT_EQ(c.first, at(job->findFirstRawData(kind, c.name, c.onlyActive))) << c.type << " " << c.name;
   }
-}
-
-TEST(DexRawData, FindFirstRawDataAnswersTheFirstMatch) {
-  const auto job = searchJob();
-  EXPECT_EQ(1, indexOf(*job, job->findFirstRawData(Kind::RAW_DATA_TOTAL_STATION, L"B", false)));
-  EXPECT_EQ(2, indexOf(*job, job->findFirstRawData(Kind::RAW_DATA_TOTAL_STATION, L"B", true)));
-  EXPECT_EQ(0, indexOf(*job, job->findFirstRawData(Kind::RAW_DATA_GNSS_AND_LEVEL, L"A", false)));
-  EXPECT_EQ(nullptr, job->findFirstRawData(Kind::RAW_DATA_NOTE, L"B", false));
 }
 
 // The searches of a walk over the list, to hold the indexed answers against.

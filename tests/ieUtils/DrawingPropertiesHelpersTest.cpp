@@ -35,81 +35,39 @@ constexpr unsigned long kBlue = 0xFF0000;
 
 // ---- Per value type: the form that holds it, how it is set and marked by layer --------------------
 
-template <class T>
-struct StyleCase;
-
-// The colour is asked of line properties here; every form has one.
-template <>
-struct StyleCase<unsigned long> {
-  static constexpr int kType = IDexDrawProperties::DRAW_LINE;
-  using Form = DexDrawLineProperties;
-  static void set(Form& properties, unsigned long value) { properties.setColor(value); }
-  static void setByLayer(Form& properties) { properties.setColorByLayer(); }
-  static unsigned long valueOf(int source) { return 0x010101UL * static_cast<unsigned long>(source + 1); }
+// The value type T of a form, set and marked by layer through the given members; source number s
+// gives the value base + s % modulus. The colour is asked of line properties here; every form has one.
+template <class T, class F, int Type, auto Set, auto ByLayer, int Base, int Modulus = 1000>
+struct StyleCase {
+  using Value = T;
+  using Form = F;
+  static constexpr int kType = Type;
+  static void set(Form& properties, T value) { (properties.*Set)(value); }
+  static void setByLayer(Form& properties) { (properties.*ByLayer)(); }
+  static T valueOf(int source) { return static_cast<T>(Base + source % Modulus); }
 };
 
-template <>
-struct StyleCase<DexDrawPointProperties::EMarkStyleType> {
-  static constexpr int kType = IDexDrawProperties::DRAW_POINT;
-  using Form = DexDrawPointProperties;
-  static void set(Form& properties, DexDrawPointProperties::EMarkStyleType value) {
-    properties.setMarkStyle(value);
-  }
-  static void setByLayer(Form& properties) { properties.setMarkStyleByLayer(); }
-  static DexDrawPointProperties::EMarkStyleType valueOf(int source) {
-    return static_cast<DexDrawPointProperties::EMarkStyleType>(source + 1);
-  }
-};
-
-template <>
-struct StyleCase<DexDrawLineProperties::EDashStyleType> {
-  static constexpr int kType = IDexDrawProperties::DRAW_LINE;
-  using Form = DexDrawLineProperties;
-  static void set(Form& properties, DexDrawLineProperties::EDashStyleType value) {
-    properties.setDashStyle(value);
-  }
-  static void setByLayer(Form& properties) { properties.setDashStyleByLayer(); }
-  static DexDrawLineProperties::EDashStyleType valueOf(int source) {
-    return static_cast<DexDrawLineProperties::EDashStyleType>(source % 5);
-  }
-};
-
-template <>
-struct StyleCase<unsigned char> {
-  static constexpr int kType = IDexDrawProperties::DRAW_LINE;
-  using Form = DexDrawLineProperties;
-  static void set(Form& properties, unsigned char value) { properties.setWidth(value); }
-  static void setByLayer(Form& properties) { properties.setWidthByLayer(); }
-  static unsigned char valueOf(int source) { return static_cast<unsigned char>(10 + source); }
-};
-
-template <>
-struct StyleCase<DexDrawAreaProperties::EFillStyleType> {
-  static constexpr int kType = IDexDrawProperties::DRAW_AREA;
-  using Form = DexDrawAreaProperties;
-  static void set(Form& properties, DexDrawAreaProperties::EFillStyleType value) {
-    properties.setFillStyleType(value);
-  }
-  static void setByLayer(Form& properties) { properties.setFillStyleByLayer(); }
-  static DexDrawAreaProperties::EFillStyleType valueOf(int source) {
-    return static_cast<DexDrawAreaProperties::EFillStyleType>(source);
-  }
-};
-
-template <>
-struct StyleCase<short> {
-  static constexpr int kType = IDexDrawProperties::DRAW_AREA;
-  using Form = DexDrawAreaProperties;
-  static void set(Form& properties, short value) { properties.setFillTransparency(value); }
-  static void setByLayer(Form& properties) { properties.setFillTransparencyByLayer(); }
-  static short valueOf(int source) { return static_cast<short>(20 + source); }
-};
+using Line = DexDrawLineProperties;
+using Point = DexDrawPointProperties;
+using Area = DexDrawAreaProperties;
+using ColorCase = StyleCase<unsigned long, Line, IDexDrawProperties::DRAW_LINE, &Line::setColor,
+                            &Line::setColorByLayer, 0x010101>;
+using MarkCase = StyleCase<Point::EMarkStyleType, Point, IDexDrawProperties::DRAW_POINT, &Point::setMarkStyle,
+                           &Point::setMarkStyleByLayer, 1>;
+using DashCase = StyleCase<Line::EDashStyleType, Line, IDexDrawProperties::DRAW_LINE, &Line::setDashStyle,
+                           &Line::setDashStyleByLayer, 0, 5>;
+using WidthCase = StyleCase<unsigned char, Line, IDexDrawProperties::DRAW_LINE, &Line::setWidth,
+                            &Line::setWidthByLayer, 10>;
+using FillCase = StyleCase<Area::EFillStyleType, Area, IDexDrawProperties::DRAW_AREA, &Area::setFillStyleType,
+                           &Area::setFillStyleByLayer, 0>;
+using TransparencyCase = StyleCase<short, Area, IDexDrawProperties::DRAW_AREA, &Area::setFillTransparency,
+                                   &Area::setFillTransparencyByLayer, 20>;
 
 // Builds one object with every place a value can come from, each place defining the value of its own
 // source number (or only the by-layer mark, or nothing), so that a test reads which place answered.
-template <class T>
+template <class Case>
 class StyleScene {
-  using Case = StyleCase<T>;
+  using T = typename Case::Value;
   using Form = typename Case::Form;
 
  public:
@@ -183,263 +141,156 @@ class StyleScene {
 
 // ---- Sources 0 to 5 for each value type -----------------------------------------------------------
 
+enum Step {
+  kOwn = 1,
+  kOwnByLayer = 2,
+  kOwnEmpty = 4,
+  kLayer = 8,
+  kLayerEmpty = 16,
+  kCode = 32,
+  kCodeByLayer = 64,
+  kCodeLayer = 128,
+  kHasCode = 256,
+  kDefault = 512
+};
+
 template <class T>
 class StyleResolution : public ::testing::Test {};
 
-using StyleValueTypes = ::testing::Types<unsigned long, DexDrawPointProperties::EMarkStyleType,
-                                         DexDrawLineProperties::EDashStyleType, unsigned char,
-                                         DexDrawAreaProperties::EFillStyleType, short>;
+using StyleValueTypes =
+    ::testing::Types<ColorCase, MarkCase, DashCase, WidthCase, FillCase, TransparencyCase>;
 TYPED_TEST_SUITE(StyleResolution, StyleValueTypes);
 
-TYPED_TEST(StyleResolution, OwnPropertiesWinOverEveryOtherSource) {
-  StyleScene<TypeParam> scene;
-  scene.ownDefines();
-  scene.objectLayerDefines();
-  scene.codeDefines();
-  scene.objectHasCode();
-  scene.defaultLayerDefines();
-  TypeParam value{};
-  EXPECT_EQ(vyn::ie::STYLE_FROM_OBJECT, scene.resolve(value));
-  EXPECT_EQ(scene.valueOf(vyn::ie::STYLE_FROM_OBJECT), value);
+// Own properties win; their by-layer mark reads the object's layer before the code; an object with a
+// code skips its layer; a code's by-layer mark reads the code's layer; the default layer comes last.
+TYPED_TEST(StyleResolution, SourcesAnswerInTheirOrder) {
+  const std::pair<int, int> rows[] = {
+      {kOwn | kLayer | kCode | kHasCode | kDefault, vyn::ie::STYLE_FROM_OBJECT},
+      {kOwnByLayer | kLayer | kCode | kHasCode, vyn::ie::STYLE_FROM_LAYER},
+      {kLayer | kDefault, vyn::ie::STYLE_FROM_LAYER},
+      {kOwnEmpty | kLayer | kDefault, vyn::ie::STYLE_FROM_DEFAULT_LAYER},
+      {kLayerEmpty | kDefault, vyn::ie::STYLE_FROM_DEFAULT_LAYER},
+      {kLayer | kCode | kHasCode, vyn::ie::STYLE_FROM_CODE},
+      {kCodeByLayer | kCodeLayer | kHasCode | kDefault, vyn::ie::STYLE_FROM_CODE_LAYER},
+      {kCodeLayer | kHasCode | kDefault, vyn::ie::STYLE_FROM_DEFAULT_LAYER},
+      {kLayer | kHasCode | kDefault, vyn::ie::STYLE_FROM_DEFAULT_LAYER}};
+  for (const auto& [steps, source] : rows) {
+    StyleScene<TypeParam> scene;
+    if (steps & kOwn) scene.ownDefines();
+    if (steps & kOwnByLayer) scene.ownByLayer();
+    if (steps & kOwnEmpty) scene.ownWithoutValue();
+    if (steps & kLayer) scene.objectLayerDefines();
+    if (steps & kLayerEmpty) scene.objectLayerWithoutValue();
+    if (steps & kCode) scene.codeDefines();
+    if (steps & kCodeByLayer) scene.codeByLayer();
+    if (steps & kCodeLayer) scene.codeLayerDefines();
+    if (steps & kHasCode) scene.objectHasCode();
+    if (steps & kDefault) scene.defaultLayerDefines();
+    typename TypeParam::Value value{};
+    EXPECT_EQ(source, scene.resolve(value)) << steps;
+    EXPECT_EQ(scene.valueOf(source), value) << steps;
+  }
 }
 
-TYPED_TEST(StyleResolution, OwnByLayerMarkReadsTheObjectLayerBeforeTheCode) {
-  StyleScene<TypeParam> scene;
-  scene.ownByLayer();
-  scene.objectLayerDefines();
-  scene.codeDefines();
-  scene.objectHasCode();
-  TypeParam value{};
-  EXPECT_EQ(vyn::ie::STYLE_FROM_LAYER, scene.resolve(value));
-  EXPECT_EQ(scene.valueOf(vyn::ie::STYLE_FROM_LAYER), value);
-}
-
-TYPED_TEST(StyleResolution, ObjectWithoutPropertiesOrCodesReadsItsLayer) {
-  StyleScene<TypeParam> scene;
-  scene.objectLayerDefines();
-  scene.defaultLayerDefines();
-  TypeParam value{};
-  EXPECT_EQ(vyn::ie::STYLE_FROM_LAYER, scene.resolve(value));
-  EXPECT_EQ(scene.valueOf(vyn::ie::STYLE_FROM_LAYER), value);
-}
-
-TYPED_TEST(StyleResolution, OwnPropertiesWithoutTheValueKeepTheLayerOut) {
-  StyleScene<TypeParam> scene;
-  scene.ownWithoutValue();
-  scene.objectLayerDefines();
-  scene.defaultLayerDefines();
-  TypeParam value{};
-  EXPECT_EQ(vyn::ie::STYLE_FROM_DEFAULT_LAYER, scene.resolve(value));
-  EXPECT_EQ(scene.valueOf(vyn::ie::STYLE_FROM_DEFAULT_LAYER), value);
-}
-
-TYPED_TEST(StyleResolution, DefaultLayerAnswersWhenNothingElseDefinesTheValue) {
-  StyleScene<TypeParam> scene;
-  scene.objectLayerWithoutValue();
-  scene.defaultLayerDefines();
-  TypeParam value{};
-  EXPECT_EQ(vyn::ie::STYLE_FROM_DEFAULT_LAYER, scene.resolve(value));
-  EXPECT_EQ(scene.valueOf(vyn::ie::STYLE_FROM_DEFAULT_LAYER), value);
-}
-
-TYPED_TEST(StyleResolution, FirstCodeAnswersAndTheObjectLayerIsNotConsulted) {
-  StyleScene<TypeParam> scene;
-  scene.objectLayerDefines();
-  scene.codeDefines();
-  scene.objectHasCode();
-  TypeParam value{};
-  EXPECT_EQ(vyn::ie::STYLE_FROM_CODE, scene.resolve(value));
-  EXPECT_EQ(scene.valueOf(vyn::ie::STYLE_FROM_CODE), value);
-}
-
-TYPED_TEST(StyleResolution, CodeByLayerMarkReadsTheLayerOfTheCode) {
-  StyleScene<TypeParam> scene;
-  scene.codeByLayer();
-  scene.codeLayerDefines();
-  scene.objectHasCode();
-  scene.defaultLayerDefines();
-  TypeParam value{};
-  EXPECT_EQ(vyn::ie::STYLE_FROM_CODE_LAYER, scene.resolve(value));
-  EXPECT_EQ(scene.valueOf(vyn::ie::STYLE_FROM_CODE_LAYER), value);
-}
-
-TYPED_TEST(StyleResolution, CodeLayerIsNotReadWithoutTheByLayerMark) {
-  StyleScene<TypeParam> scene;
-  scene.codeLayerDefines();
-  scene.objectHasCode();
-  scene.defaultLayerDefines();
-  TypeParam value{};
-  EXPECT_EQ(vyn::ie::STYLE_FROM_DEFAULT_LAYER, scene.resolve(value));
-}
-
-TYPED_TEST(StyleResolution, ObjectWithACodeSkipsItsLayerWhenTheCodeDefinesNothing) {
-  StyleScene<TypeParam> scene;
-  scene.objectLayerDefines();
-  scene.objectHasCode();
-  scene.defaultLayerDefines();
-  TypeParam value{};
-  EXPECT_EQ(vyn::ie::STYLE_FROM_DEFAULT_LAYER, scene.resolve(value));
-}
-
-TYPED_TEST(StyleResolution, NothingDefinedAndNoDefaultLayerIsNotFoundSilently) {
+// Nothing defined: without a default layer silently, with one lacking the value with a log record.
+TYPED_TEST(StyleResolution, NothingDefinedIsNotFound) {
   dex_test::LogCapture log;
   StyleScene<TypeParam> scene;
-  scene.objectHasCode();
-  const TypeParam untouched = scene.valueOf(7);
-  TypeParam value = untouched;
+  const auto untouched = scene.valueOf(7);
+  auto value = untouched;
   EXPECT_EQ(vyn::ie::STYLE_NOT_FOUND, scene.resolve(value, false));
-  EXPECT_EQ(untouched, value);
   EXPECT_EQ(0u, log.size());
-}
-
-TYPED_TEST(StyleResolution, DefaultLayerWithoutTheValueIsNotFoundWithLogRecordAndMessage) {
-  dex_test::LogCapture log;
-  StyleScene<TypeParam> scene;
-  const TypeParam untouched = scene.valueOf(7);
-  TypeParam value = untouched;
   EXPECT_EQ(vyn::ie::STYLE_NOT_FOUND, scene.resolve(value));
   EXPECT_EQ(untouched, value);
   EXPECT_EQ(1, log.count(kLogSource, kNoStyleInDefaultLayerLine));
   EXPECT_EQ(1, log.countMessage(kNoStyleMessage));
   ASSERT_EQ(2u, log.size());
   EXPECT_EQ(4, log.records()[1].level);
+  scene.objectHasCode();
+  EXPECT_EQ(vyn::ie::STYLE_NOT_FOUND, scene.resolve(value, false));
+  EXPECT_EQ(2u, log.size());
 }
 
 // ---- The cases of a drawing exporter ------------------------------------------------------------
 
-// A point whose colour is defined by the given properties, on a layer whose point colour is blue.
-struct PointOnBlueLayer {
-  PointOnBlueLayer() {
-    layer.setDrawProperties(IDexDrawProperties::DRAW_POINT, new DexDrawPointProperties());
-    layer.setColor(kBlue);
-    point.setLayer(&layer, false);
-  }
+template <class Properties>
+Properties* coloured(unsigned long color, Properties* properties = new Properties()) {
+  if (color != 0)
+    properties->setColor(color);
+  else
+    properties->setColorByLayer();
+  return properties;
+}
+
+TEST(ObjectStyle, PointsOnABlueLayerTakeTheirOwnTheLayersOrTheCodesColour) {
+  constexpr auto kPoint = IDexDrawProperties::DRAW_POINT;
   DexLayer layer;
+  layer.setDrawProperties(kPoint, new DexDrawPointProperties());
+  layer.setColor(kBlue);
   DexDesignPoint point;
-};
-
-TEST(ObjectStyle, PointWithOwnRedColourIsRedEvenOnABlueLayer) {
-  PointOnBlueLayer scene;
-  auto* const own = new DexDrawPointProperties();
-  own->setColor(kRed);
-  scene.point.setDrawProperties(own);
+  point.setLayer(&layer, false);
   unsigned long color = 0;
-  EXPECT_EQ(vyn::ie::STYLE_FROM_OBJECT,
-            getObjectStyle(IDexDrawProperties::DRAW_POINT, &scene.point, color, nullptr));
-  EXPECT_EQ(kRed, color);
-}
-
-TEST(ObjectStyle, PointWithColourByLayerTakesTheBlueOfItsLayer) {
-  PointOnBlueLayer scene;
-  auto* const own = new DexDrawPointProperties();
-  own->setColorByLayer();
-  scene.point.setDrawProperties(own);
-  unsigned long color = 0;
-  EXPECT_EQ(vyn::ie::STYLE_FROM_LAYER,
-            getObjectStyle(IDexDrawProperties::DRAW_POINT, &scene.point, color, nullptr));
+  EXPECT_EQ(vyn::ie::STYLE_FROM_LAYER, getObjectStyle(kPoint, &point, color, nullptr));
   EXPECT_EQ(kBlue, color);
-}
-
-TEST(ObjectStyle, PointWithoutPropertiesTakesItsLayerUntilACodeDefinesGreen) {
-  PointOnBlueLayer scene;
-  unsigned long color = 0;
-  EXPECT_EQ(vyn::ie::STYLE_FROM_LAYER,
-            getObjectStyle(IDexDrawProperties::DRAW_POINT, &scene.point, color, nullptr));
-  EXPECT_EQ(kBlue, color);
-
   DexCodeDescription description(L"TREE");
-  auto* const byCode = new DexDrawPointProperties();
-  byCode->setColor(kGreen);
-  description.setDrawProperties(IDexDrawProperties::DRAW_POINT, byCode);
-  scene.point.addCode(new DexCodeValues(&description));
-  EXPECT_EQ(vyn::ie::STYLE_FROM_CODE,
-            getObjectStyle(IDexDrawProperties::DRAW_POINT, &scene.point, color, nullptr));
+  description.setDrawProperties(kPoint, coloured<DexDrawPointProperties>(kGreen));
+  point.addCode(new DexCodeValues(&description));
+  EXPECT_EQ(vyn::ie::STYLE_FROM_CODE, getObjectStyle(kPoint, &point, color, nullptr));
   EXPECT_EQ(kGreen, color);
+  point.setDrawProperties(coloured<DexDrawPointProperties>(kRed));
+  EXPECT_EQ(vyn::ie::STYLE_FROM_OBJECT, getObjectStyle(kPoint, &point, color, nullptr));
+  EXPECT_EQ(kRed, color);
+  dex_test::LogCapture log;  // a draw type outside the table finds nothing
+  color = 0;
+  EXPECT_EQ(vyn::ie::STYLE_NOT_FOUND, getObjectStyle(3, &point, color, &layer));
+  EXPECT_EQ(0UL, color);
+  EXPECT_EQ(1, log.count(kLogSource, kNoStyleInDefaultLayerLine));
+  point.setDrawProperties(coloured<DexDrawPointProperties>(0));
+  EXPECT_EQ(vyn::ie::STYLE_FROM_LAYER, getObjectStyle(kPoint, &point, color, nullptr));
+  EXPECT_EQ(kBlue, color);
+  // Point properties have no width: by layer or not, they give none, and the default layer neither.
+  DexDesignPoint alone;
+  alone.setDrawProperties(coloured<DexDrawPointProperties>(0));
+  unsigned char width = 9;
+  EXPECT_EQ(vyn::ie::STYLE_NOT_FOUND, getObjectStyle(kPoint, &alone, width, &layer));
+  EXPECT_EQ(9, width);
+  EXPECT_EQ(2, log.count(kLogSource, kNoStyleInDefaultLayerLine));
 }
 
-TEST(ObjectStyle, CodeWidthByLayerTakesTheWidthOfTheCodeLayer) {
+TEST(ObjectStyle, LinesAndAreasReadTheFormOfTheirDrawType) {
+  constexpr auto kLine = IDexDrawProperties::DRAW_LINE;
   DexLayer codeLayer;
-  codeLayer.setDrawProperties(IDexDrawProperties::DRAW_LINE,
-                              new DexDrawLineProperties(kRed, 3, DexDrawLineProperties::DASH_DOT));
+  codeLayer.setDrawProperties(kLine, new DexDrawLineProperties(kRed, 3, DexDrawLineProperties::DASH_DOT));
   DexCodeDescription description(L"FENCE");
   auto* const byCode = new DexDrawLineProperties();
   byCode->setWidthByLayer();
-  description.setDrawProperties(IDexDrawProperties::DRAW_LINE, byCode);
+  description.setDrawProperties(kLine, byCode);
   description.setLayer(&codeLayer);
   vyn::ie::DexPolyLine line;
   line.addCode(new DexCodeValues(&description));
   unsigned char width = 0;
-  EXPECT_EQ(vyn::ie::STYLE_FROM_CODE_LAYER,
-            getObjectStyle(IDexDrawProperties::DRAW_LINE, &line, width, nullptr));
+  EXPECT_EQ(vyn::ie::STYLE_FROM_CODE_LAYER, getObjectStyle(kLine, &line, width, nullptr));
   EXPECT_EQ(3, width);
-}
-
-TEST(ObjectStyle, OwnPropertiesOfAnotherDrawTypeAreNotRead) {
-  DexDesignPoint point;
-  auto* const own = new DexDrawPointProperties();
-  own->setColor(kRed);
-  point.setDrawProperties(own);
+  DexDesignPoint point;  // own properties of another draw type are not read
+  point.setDrawProperties(coloured<DexDrawPointProperties>(kRed));
   DexLayer defaultLayer;
-  defaultLayer.setDrawProperties(IDexDrawProperties::DRAW_LINE,
-                                 new DexDrawLineProperties(kBlue, 1, DexDrawLineProperties::DASH_SOLID));
+  defaultLayer.setDrawProperties(kLine,
+                                 new DexDrawLineProperties(kBlue, 4, DexDrawLineProperties::DASH_DASH));
   unsigned long color = 0;
-  EXPECT_EQ(vyn::ie::STYLE_FROM_DEFAULT_LAYER,
-            getObjectStyle(IDexDrawProperties::DRAW_LINE, &point, color, &defaultLayer));
+  EXPECT_EQ(vyn::ie::STYLE_FROM_DEFAULT_LAYER, getObjectStyle(kLine, &point, color, &defaultLayer));
   EXPECT_EQ(kBlue, color);
-}
-
-TEST(ObjectStyle, AreaDrawnAsAreaReadsItsAreaPropertiesAndAsLineItsOutline) {
-  DexArea area;
-  auto* const fill = new DexDrawAreaProperties();
-  fill->setColor(kGreen);
-  area.setAreaDrawProperties(fill);
+  auto dash = DexDrawLineProperties::DASH_SOLID;  // a null object reads only the default layer
+  const DexObject* const none = nullptr;
+  EXPECT_EQ(vyn::ie::STYLE_FROM_DEFAULT_LAYER, getObjectStyle(kLine, none, dash, &defaultLayer));
+  EXPECT_EQ(DexDrawLineProperties::DASH_DASH, dash);
+  EXPECT_EQ(vyn::ie::STYLE_NOT_FOUND, getObjectStyle(kLine, none, dash, nullptr));
+  DexArea area;  // drawn as an area its area properties, as a line its outline
+  area.setAreaDrawProperties(coloured<DexDrawAreaProperties>(kGreen));
   area.setDrawProperties(new DexDrawLineProperties(kRed, 2, DexDrawLineProperties::DASH_SOLID));
-  unsigned long color = 0;
   EXPECT_EQ(vyn::ie::STYLE_FROM_OBJECT, getObjectStyle(IDexDrawProperties::DRAW_AREA, &area, color, nullptr));
   EXPECT_EQ(kGreen, color);
-  EXPECT_EQ(vyn::ie::STYLE_FROM_OBJECT, getObjectStyle(IDexDrawProperties::DRAW_LINE, &area, color, nullptr));
+  EXPECT_EQ(vyn::ie::STYLE_FROM_OBJECT, getObjectStyle(kLine, &area, color, nullptr));
   EXPECT_EQ(kRed, color);
-}
-
-TEST(ObjectStyle, WidthIsNotReadFromPropertiesOfAnotherForm) {
-  // Point properties have no width: by layer or not, they give none, and the point has no layer.
-  DexDesignPoint point;
-  auto* const own = new DexDrawPointProperties();
-  own->setColorByLayer();
-  point.setDrawProperties(own);
-  DexLayer defaultLayer;
-  defaultLayer.setDrawProperties(IDexDrawProperties::DRAW_POINT, new DexDrawPointProperties());
-  dex_test::LogCapture log;
-  unsigned char width = 9;
-  EXPECT_EQ(vyn::ie::STYLE_NOT_FOUND,
-            getObjectStyle(IDexDrawProperties::DRAW_POINT, &point, width, &defaultLayer));
-  EXPECT_EQ(9, width);
-  EXPECT_EQ(1, log.count(kLogSource, kNoStyleInDefaultLayerLine));
-}
-
-TEST(ObjectStyle, NullObjectReadsOnlyTheDefaultLayer) {
-  DexLayer defaultLayer;
-  defaultLayer.setDrawProperties(IDexDrawProperties::DRAW_LINE,
-                                 new DexDrawLineProperties(kBlue, 4, DexDrawLineProperties::DASH_DASH));
-  DexDrawLineProperties::EDashStyleType dash = DexDrawLineProperties::DASH_SOLID;
-  EXPECT_EQ(vyn::ie::STYLE_FROM_DEFAULT_LAYER,
-            getObjectStyle(IDexDrawProperties::DRAW_LINE, static_cast<const DexObject*>(nullptr), dash,
-                           &defaultLayer));
-  EXPECT_EQ(DexDrawLineProperties::DASH_DASH, dash);
-  EXPECT_EQ(vyn::ie::STYLE_NOT_FOUND, getObjectStyle(IDexDrawProperties::DRAW_LINE,
-                                                     static_cast<const DexObject*>(nullptr), dash, nullptr));
-}
-
-TEST(ObjectStyle, DrawTypeOutsideTheTableFindsNothing) {
-  PointOnBlueLayer scene;
-  auto* const own = new DexDrawPointProperties();
-  own->setColor(kRed);
-  scene.point.setDrawProperties(own);
-  dex_test::LogCapture log;
-  unsigned long color = 0;
-  EXPECT_EQ(vyn::ie::STYLE_NOT_FOUND, getObjectStyle(3, &scene.point, color, &scene.layer));
-  EXPECT_EQ(0UL, color);
-  EXPECT_EQ(1, log.count(kLogSource, kNoStyleInDefaultLayerLine));
 }
 
 }  // namespace

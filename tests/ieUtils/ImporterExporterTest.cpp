@@ -52,25 +52,13 @@ class PlainImporter : public DexImporterImpl {
   EDexResult doImport() override { return DEX_RESULT_OK; }
 };
 
-TEST(ImporterExporterImporter, AddsTheImportDatasetToAnEmptyContainerWhenPointsAreRequested) {
-  DexData data(settingsWith({POINTS}));
-  const PlainImporter importer(&data, L"in.txt", nullptr);
-  ASSERT_EQ(1, data.getNumberOfDatasets());
-  EXPECT_EQ(L"Import dataset", std::wstring(data.getDatasetAt(0)->getName().view()));
-}
-
-TEST(ImporterExporterImporter, AddsNoDatasetWhenOnlyCodesAreRequested) {
-  DexData data(settingsWith({CODES}));
-  const PlainImporter importer(&data, L"in.txt", nullptr);
-  EXPECT_EQ(0, data.getNumberOfDatasets());
-}
-
-TEST(ImporterExporterImporter, EveryKindOfObjectDataGetsTheImportDataset) {
+TEST(ImporterExporterImporter, AddsTheImportDatasetToAnEmptyContainerForObjectData) {
   for (const EDexDataType type : {POINTS, LINES, AREAS, PARCELS, ROADS, SURFACES, POINT_LISTS, ROAD_SURVEY,
                                   SCANNING_DATA, JOB_HISTORY, RAW_DATA, MULTIPLE}) {
     DexData data(settingsWith({type}));
     const PlainImporter importer(&data, L"in.txt", nullptr);
-    EXPECT_EQ(1, data.getNumberOfDatasets()) << "data type " << type;
+    ASSERT_EQ(1, data.getNumberOfDatasets()) << "data type " << type;
+    EXPECT_EQ(L"Import dataset", std::wstring(data.getDatasetAt(0)->getName().view()));
   }
   for (const EDexDataType type :
        {CODES, H_ALIGNMENTS, X_SECTION_TEMPLATES, LOCALIZATION, STA_EQUATION_SETS}) {
@@ -78,20 +66,13 @@ TEST(ImporterExporterImporter, EveryKindOfObjectDataGetsTheImportDataset) {
     const PlainImporter importer(&data, L"in.txt", nullptr);
     EXPECT_EQ(0, data.getNumberOfDatasets()) << "data type " << type;
   }
-}
-
-TEST(ImporterExporterImporter, AddsNoDatasetToAContainerThatHasDatasets) {
-  DexData data(settingsWith({POINTS}));
+  DexData data(settingsWith({POINTS}));  // nor to a container that has datasets
   data.addDataset(new DexDataset(L"first", 0, false));
   data.addDataset(new DexDataset(L"second", 0, false));
   const PlainImporter importer(&data, L"in.txt", nullptr);
   EXPECT_EQ(2, data.getNumberOfDatasets());
-}
-
-TEST(ImporterExporterImporter, ANullContainerIsLeftAlone) {
-  const PlainImporter importer(nullptr, L"in.txt", nullptr);
-  EXPECT_EQ(nullptr, importer.getData());
-  EXPECT_EQ(L"in.txt", std::wstring(importer.getFileName().view()));
+  const PlainImporter alone(nullptr, L"in.txt", nullptr);  // a null container is left alone
+  EXPECT_TRUE(alone.getData() == nullptr && alone.getFileName() == L"in.txt");
 }
 
 TEST(ImporterExporterImporter, CopiesShareTheContainerAndTheFormat) {
@@ -99,14 +80,10 @@ TEST(ImporterExporterImporter, CopiesShareTheContainerAndTheFormat) {
   const DexFormat format = dex_test::scriptedFormat();
   const PlainImporter importer(&data, L"in.txt", &format);
   const PlainImporter copy(importer);
-  EXPECT_EQ(&data, copy.getData());
-  EXPECT_EQ(&format, copy.getFormat());
+  EXPECT_TRUE(copy.getData() == &data && copy.getFormat() == &format);
   EXPECT_EQ(1, data.getNumberOfDatasets());  // copying prepares nothing again
-}
-
-TEST(ImporterExporterImporter, DoImportFollowsTheDestructorInTheVirtualTable) {
   if (const auto slot = PlainImporter::doImportSlot()) {
-    EXPECT_EQ(2, *slot);
+    EXPECT_EQ(2, *slot);  // after the destructor
   }
 }
 
@@ -162,27 +139,33 @@ class ImporterExporterDriver : public ::testing::Test {
   DexData data_{settingsWith({POINTS})};
 };
 
-TEST_F(ImporterExporterDriver, StepsUntilTheLastAndReportsOk) {
+TEST_F(ImporterExporterDriver, StepsUntilTheLastAndReportsTheResultSetThen) {
+  const StepExporter fresh(&data_, {});
+  EXPECT_TRUE(fresh.getCurrentStep() == -2 && fresh.getIEResult() == DEX_RESULT_OK);
+  data_.getProgress().begin(DexRunProgress::EXPORT_RUN);
   StepExporter exporter(&data_, {true, true, false});
   EXPECT_EQ(DEX_RESULT_OK, exporter.doExport());
-  EXPECT_EQ(3, exporter.calls);
-  EXPECT_EQ(2, exporter.getCurrentStep());
-}
-
-TEST_F(ImporterExporterDriver, AnExporterThatNeverAdvancesReportsAFileError) {
-  StepExporter exporter(&data_, {false}, false);
-  EXPECT_EQ(DEX_RESULT_FILE_ERROR, exporter.doExport());
-  EXPECT_EQ(1, exporter.calls);
-  EXPECT_EQ(-2, exporter.getCurrentStep());
-}
-
-TEST_F(ImporterExporterDriver, TheResultSetBeforeTheLastStepIsReported) {
-  StepExporter exporter(&data_, {true, false});
-  exporter.resultAtLastStep = static_cast<EDexResult>(5);
-  EXPECT_EQ(5, exporter.doExport());
+  EXPECT_TRUE(exporter.calls == 3 && exporter.getCurrentStep() == 2);
+  const DexRunProgress::Snapshot figures = data_.getProgress().get();  // every step is published
+  EXPECT_TRUE(figures.currentStep == 2 && figures.numberOfSteps == 3);
+  EXPECT_DOUBLE_EQ(1.0, data_.getProgress().getFraction());
+  StepExporter never(&data_, {false}, false);  // one that never advances reports a file error
+  EXPECT_EQ(DEX_RESULT_FILE_ERROR, never.doExport());
+  EXPECT_TRUE(never.calls == 1 && never.getCurrentStep() == -2);
+  StepExporter five(nullptr, {true, false});  // even without container
+  five.resultAtLastStep = static_cast<EDexResult>(5);
+  EXPECT_EQ(5, five.doExport());
   StepExporter failing(&data_, {false});
   failing.resultAtLastStep = DEX_RESULT_WRONG_FORMAT;
   EXPECT_EQ(DEX_RESULT_WRONG_FORMAT, failing.doExport());
+  const StepExporter copy(five);  // copies take all five fields
+  EXPECT_TRUE(copy.getData() == nullptr && copy.getCurrentStep() == five.getCurrentStep() &&
+              copy.getIEResult() == 5 && copy.getFileName() == L"out.txt");
+  const int expected[] = {2, 3, 4, 5};  // the virtual operations keep their slots
+  for (int which = 0; which < 4; ++which)
+    if (const auto slot = StepExporter::slotOf(which)) {
+      EXPECT_EQ(expected[which], *slot) << which;
+    }
 }
 
 TEST_F(ImporterExporterDriver, TheStopFlagEndsTheExportRightAfterTheRunningStep) {
@@ -190,54 +173,11 @@ TEST_F(ImporterExporterDriver, TheStopFlagEndsTheExportRightAfterTheRunningStep)
   exporter.stopAtCall = 1;
   EXPECT_EQ(DEX_RESULT_STOPPED, exporter.doExport());
   EXPECT_EQ(2, exporter.calls);
-}
-
-TEST_F(ImporterExporterDriver, TheStopFlagWinsOverTheLastStepsResult) {
-  StepExporter exporter(&data_, {false});
-  exporter.stopAtCall = 0;
-  exporter.resultAtLastStep = static_cast<EDexResult>(5);
-  EXPECT_EQ(DEX_RESULT_STOPPED, exporter.doExport());
-}
-
-TEST_F(ImporterExporterDriver, PublishesEveryStepToTheProgressRecord) {
-  data_.getProgress().begin(DexRunProgress::EXPORT_RUN);
-  StepExporter exporter(&data_, {true, true, false});
-  exporter.doExport();
-  const DexRunProgress::Snapshot figures = data_.getProgress().get();
-  EXPECT_EQ(exporter.getCurrentStep(), figures.currentStep);
-  EXPECT_EQ(3, figures.numberOfSteps);
-  EXPECT_DOUBLE_EQ(1.0, data_.getProgress().getFraction());
-}
-
-TEST_F(ImporterExporterDriver, AnExporterWithoutContainerStillRuns) {
-  StepExporter exporter(nullptr, {true, false});
-  EXPECT_EQ(DEX_RESULT_OK, exporter.doExport());
-}
-
-TEST_F(ImporterExporterDriver, StartsAtStepMinusTwoWithAnOkResult) {
-  const StepExporter exporter(&data_, {});
-  EXPECT_EQ(-2, exporter.getCurrentStep());
-  EXPECT_EQ(DEX_RESULT_OK, exporter.getIEResult());
-}
-
-TEST_F(ImporterExporterDriver, CopiesTakeAllFiveFields) {
-  StepExporter exporter(&data_, {true, false});
-  exporter.resultAtLastStep = static_cast<EDexResult>(9);
-  exporter.doExport();
-  const StepExporter copy(exporter);
-  EXPECT_EQ(&data_, copy.getData());
-  EXPECT_EQ(exporter.getCurrentStep(), copy.getCurrentStep());
-  EXPECT_EQ(9, copy.getIEResult());
-  EXPECT_EQ(L"out.txt", std::wstring(copy.getFileName().view()));
-}
-
-TEST_F(ImporterExporterDriver, TheVirtualOperationsKeepTheirSlots) {
-  const int expected[] = {2, 3, 4, 5};
-  for (int which = 0; which < 4; ++which) {
-    if (const auto slot = StepExporter::slotOf(which)) {
-      EXPECT_EQ(expected[which], *slot) << which;
-    }
-  }
+  DexData::stopProcess_ = false;
+  StepExporter last(&data_, {false});  // and wins over the last step's result
+  last.stopAtCall = 0;
+  last.resultAtLastStep = static_cast<EDexResult>(5);
+  EXPECT_EQ(DEX_RESULT_STOPPED, last.doExport());
 }
 
 // ---- The overwrite question -------------------------------------------------------------------------------
@@ -285,65 +225,46 @@ class ImporterExporterOverwrite : public ::testing::Test {
   HWND window_ = reinterpret_cast<HWND>(0x1234);
 };
 
-TEST_F(ImporterExporterOverwrite, AMissingFileMayBeWrittenWithoutAQuestion) {
-  RecordingMsgUi ui(IDNO);
+TEST_F(ImporterExporterOverwrite, AMissingFileNeedsNoQuestionAnExistingOneTheHostsYes) {
   RecordingMessageBox box(IDNO);
-  EXPECT_TRUE(utils::isExportFileWithSameName(dir_.wfile("missing.txt").c_str(), nullptr, window_));
-  EXPECT_TRUE(utils::isExportFileWithSameName(dir_.wfile("missing.txt").c_str(), &box, window_));
-  EXPECT_TRUE(ui.questions.empty());
-  EXPECT_EQ(0, box.calls);
-}
-
-TEST_F(ImporterExporterOverwrite, WithoutAMessageBoxTheHostServiceIsAskedTheFormattedQuestion) {
-  const std::string file = dir_.write("job.txt", "old");
   {
-    RecordingMsgUi ui(IDYES);
-    EXPECT_TRUE(utils::isExportFileWithSameName(dex_test::widen(file).c_str(), nullptr, window_));
+    RecordingMsgUi ui(IDNO);
+    EXPECT_TRUE(utils::isExportFileWithSameName(dir_.wfile("missing.txt").c_str(), nullptr, window_));
+    EXPECT_TRUE(utils::isExportFileWithSameName(dir_.wfile("missing.txt").c_str(), &box, window_));
+    EXPECT_TRUE(ui.questions.empty() && box.calls == 0);
+    EXPECT_FALSE(utils::isExportFileWithSameName(dir_.wpath().c_str(), nullptr, window_));  // a folder too
+    EXPECT_EQ(1u, ui.questions.size());
+  }
+  const std::wstring file = dex_test::widen(dir_.write("job.txt", "old"));
+  {
+    RecordingMsgUi ui(IDYES);  // without a message box the host service is asked
+    EXPECT_TRUE(utils::isExportFileWithSameName(file.c_str(), nullptr, window_));
     ASSERT_EQ(1u, ui.questions.size());
-    const std::wstring shortPath(FileFuncs::CompactPath(window_, dex_test::widen(file).c_str(), true).view());
+    const std::wstring shortPath(FileFuncs::CompactPath(window_, file.c_str(), true).view());
     EXPECT_EQ(L"File " + shortPath + L" already exists. Overwrite?", ui.questions[0]);
     EXPECT_EQ(0u, ui.lastFlags);
   }
-  RecordingMsgUi ui(IDNO);
-  EXPECT_FALSE(utils::isExportFileWithSameName(dex_test::widen(file).c_str(), nullptr, window_));
-}
-
-TEST_F(ImporterExporterOverwrite, OnlyTheYesAnswerAllowsTheOverwrite) {
-  const std::string file = dir_.write("job.txt", "old");
-  for (const int answer : {IDOK, IDCANCEL, IDNO, 0, -1}) {
+  for (const int answer : {IDOK, IDCANCEL, IDNO, 0, -1}) {  // only yes allows the overwrite
     RecordingMsgUi ui(answer);
-    EXPECT_FALSE(utils::isExportFileWithSameName(dex_test::widen(file).c_str(), nullptr, window_)) << answer;
+    EXPECT_FALSE(utils::isExportFileWithSameName(file.c_str(), nullptr, window_)) << answer;
   }
+  RecordingMessageBox throwing(IDYES, true);  // a message box that throws refuses it
+  EXPECT_FALSE(utils::isExportFileWithSameName(file.c_str(), &throwing, window_));
+  EXPECT_EQ(1, throwing.calls);
 }
 
 TEST_F(ImporterExporterOverwrite, AMessageBoxIsAskedWithTheWindowAndTheShortPath) {
   std::filesystem::create_directories(dir_.file("a-rather-long-folder-name/another-long-folder-name"));
-  const std::string file = dir_.write("a-rather-long-folder-name/another-long-folder-name/job.txt", "old");
-  const std::wstring wideFile = dex_test::widen(file);
+  const std::wstring file =
+      dex_test::widen(dir_.write("a-rather-long-folder-name/another-long-folder-name/job.txt", "old"));
   RecordingMsgUi ui(IDYES);
   RecordingMessageBox yes(IDYES);
-  EXPECT_TRUE(utils::isExportFileWithSameName(wideFile.c_str(), &yes, window_));
-  EXPECT_EQ(1, yes.calls);
-  EXPECT_EQ(window_, yes.window);
-  EXPECT_EQ(std::wstring(FileFuncs::CompactPath(window_, wideFile.c_str(), true).view()), yes.path);
-  EXPECT_LT(yes.path.size(), wideFile.size());
-  EXPECT_TRUE(ui.questions.empty());
-
+  EXPECT_TRUE(utils::isExportFileWithSameName(file.c_str(), &yes, window_));
+  EXPECT_TRUE(yes.calls == 1 && yes.window == window_ && ui.questions.empty());
+  EXPECT_EQ(std::wstring(FileFuncs::CompactPath(window_, file.c_str(), true).view()), yes.path);
+  EXPECT_LT(yes.path.size(), file.size());
   RecordingMessageBox no(IDNO);
-  EXPECT_FALSE(utils::isExportFileWithSameName(wideFile.c_str(), &no, window_));
-}
-
-TEST_F(ImporterExporterOverwrite, AMessageBoxThatThrowsRefusesTheOverwrite) {
-  const std::string file = dir_.write("job.txt", "old");
-  RecordingMessageBox box(IDYES, true);
-  EXPECT_FALSE(utils::isExportFileWithSameName(dex_test::widen(file).c_str(), &box, window_));
-  EXPECT_EQ(1, box.calls);
-}
-
-TEST_F(ImporterExporterOverwrite, AnExistingFolderCountsAsAnExistingFile) {
-  RecordingMsgUi ui(IDNO);
-  EXPECT_FALSE(utils::isExportFileWithSameName(dir_.wpath().c_str(), nullptr, window_));
-  EXPECT_EQ(1u, ui.questions.size());
+  EXPECT_FALSE(utils::isExportFileWithSameName(file.c_str(), &no, window_));
 }
 
 // ---- The run functions called directly --------------------------------------------------------------------
@@ -380,39 +301,38 @@ class ImporterExporterRunFunctions : public ::testing::Test {
   DexFormat format_ = dex_test::scriptedFormat();
 };
 
-TEST_F(ImporterExporterRunFunctions, ANullBlockFails) {
-  EXPECT_EQ(DEX_RESULT_FAILED, ImportFunction(nullptr));
-  EXPECT_EQ(DEX_RESULT_FAILED, exportFunction(nullptr));
-}
-
-TEST_F(ImporterExporterRunFunctions, NoDataFailsAndNoFormatHasNoParser) {
+TEST_F(ImporterExporterRunFunctions, NoBlockOrDataFailsAndNoFormatOrEntryPointHasNoParser) {
+  EXPECT_TRUE(ImportFunction(nullptr) == DEX_RESULT_FAILED && exportFunction(nullptr) == DEX_RESULT_FAILED);
   EXPECT_EQ(DEX_RESULT_FAILED, ImportFunction(newParams(nullptr, &format_, &makePlainImporter, false)));
   EXPECT_EQ(DEX_RESULT_NO_PARSER, ImportFunction(newParams(&data_, nullptr, &makePlainImporter, false)));
   EXPECT_EQ(DEX_RESULT_FAILED, exportFunction(newParams(nullptr, &format_, &makeNoExporter, false)));
   EXPECT_EQ(DEX_RESULT_NO_PARSER, exportFunction(newParams(&data_, nullptr, &makeNoExporter, false)));
-}
-
-TEST_F(ImporterExporterRunFunctions, AnEntryPointOfTheOtherDirectionCountsAsNone) {
+  // An entry point of the other direction counts as none.
   EXPECT_EQ(DEX_RESULT_NO_PARSER, ImportFunction(newParams(&data_, &format_, &makeNoExporter, false)));
   EXPECT_EQ(DEX_RESULT_NO_PARSER, exportFunction(newParams(&data_, &format_, &makePlainImporter, false)));
   EXPECT_EQ(DEX_RESULT_NO_PARSER, ImportFunction(newParams(&data_, &format_, {}, false)));
   EXPECT_EQ(DEX_RESULT_NO_PARSER,
             ImportFunction(newParams(&data_, &format_, MakeImporterFunction{nullptr}, false)));
+  // The thread functions answer the result as exit code.
+  const unsigned code = ImportThreadFunction(newParams(&data_, nullptr, &makePlainImporter, false));
+  EXPECT_EQ(DEX_RESULT_NO_PARSER, DexParsersLoader::resultFromExitCode(code));
+  const unsigned exportCode = exportThreadFunction(newParams(nullptr, &format_, &makeNoExporter, false));
+  EXPECT_EQ(DEX_RESULT_FAILED, DexParsersLoader::resultFromExitCode(exportCode));
 }
 
-TEST_F(ImporterExporterRunFunctions, RunsAnImporterAndNotifiesOnlyForAThreadOfItsOwn) {
+TEST_F(ImporterExporterRunFunctions, NotifiesSuccessAndFailureOnlyForAThreadOfItsOwn) {
+  data_.getProgress().begin(DexRunProgress::EXPORT_RUN);
+  data_.getProgress().setExportStep(3, 4);
   EXPECT_EQ(DEX_RESULT_OK, ImportFunction(newParams(&data_, &format_, &makePlainImporter, false)));
   EXPECT_EQ(0, recorded_.imports->calls);
+  // An import starts the progress record of its data.
+  EXPECT_TRUE(data_.getProgress().get().kind == DexRunProgress::IMPORT_RUN &&
+              data_.getProgress().get().currentStep == -2);
   EXPECT_EQ(DEX_RESULT_OK, ImportFunction(newParams(&data_, &format_, &makePlainImporter, true)));
-  EXPECT_EQ(1, recorded_.imports->calls);
-  EXPECT_EQ(DEX_RESULT_OK, recorded_.imports->result);
-  EXPECT_EQ(0, recorded_.exports->calls);
-}
-
-TEST_F(ImporterExporterRunFunctions, AFailedRunInAThreadOfItsOwnIsNotifiedToo) {
+  EXPECT_TRUE(recorded_.imports->calls == 1 && recorded_.imports->result == DEX_RESULT_OK &&
+              recorded_.exports->calls == 0);
   EXPECT_EQ(DEX_RESULT_NO_PARSER, exportFunction(newParams(&data_, &format_, &makeNoExporter, true)));
-  EXPECT_EQ(1, recorded_.exports->calls);
-  EXPECT_EQ(DEX_RESULT_NO_PARSER, recorded_.exports->result);
+  EXPECT_TRUE(recorded_.exports->calls == 1 && recorded_.exports->result == DEX_RESULT_NO_PARSER);
   EXPECT_EQ(DEX_RESULT_NO_PARSER, ImportFunction(newParams(&data_, &format_, &makeNoImporter, true)));
   EXPECT_EQ(DEX_RESULT_NO_PARSER, recorded_.imports->result);
 }

@@ -4,55 +4,37 @@
 
 #include <atomic>
 #include <cstdint>
+#include <string>
 #include <thread>
+
+namespace {
 
 using vyn::ie::DexRunProgress;
 
-TEST(RunProgress, StartsWithoutARunAndWithoutAFraction) {
-  const DexRunProgress progress;
-  const DexRunProgress::Snapshot figures = progress.get();
-  EXPECT_EQ(DexRunProgress::NO_RUN, figures.kind);
-  EXPECT_EQ(-2, figures.currentStep);
-  EXPECT_EQ(0, figures.numberOfSteps);
-  EXPECT_EQ(0u, figures.bytesRead);
-  EXPECT_EQ(0u, figures.bytesTotal);
-  EXPECT_LT(progress.getFraction(), 0.0);
+// The figures as "kind step/steps read/total".
+std::string figuresOf(const DexRunProgress& progress) {
+  const DexRunProgress::Snapshot s = progress.get();
+  return std::to_string(s.kind) + " " + std::to_string(s.currentStep) + "/" +
+         std::to_string(s.numberOfSteps) + " " + std::to_string(s.bytesRead) + "/" +
+         std::to_string(s.bytesTotal);
 }
 
-TEST(RunProgress, ExportFractionCountsTheStepsCarriedOut) {
+TEST(RunProgress, ExportFractionCountsTheStepsCarriedOutAndImportFractionTheBytesRead) {
   DexRunProgress progress;
+  EXPECT_EQ(figuresOf(progress), std::to_string(DexRunProgress::NO_RUN) + " -2/0 0/0");
+  EXPECT_LT(progress.getFraction(), 0.0);
   progress.begin(DexRunProgress::EXPORT_RUN);
   EXPECT_LT(progress.getFraction(), 0.0);  // no number of steps yet
-  progress.setExportStep(0, 4);
-  EXPECT_DOUBLE_EQ(0.25, progress.getFraction());
-  progress.setExportStep(3, 4);
-  EXPECT_DOUBLE_EQ(1.0, progress.getFraction());
-  const DexRunProgress::Snapshot figures = progress.get();
-  EXPECT_EQ(3, figures.currentStep);
-  EXPECT_EQ(4, figures.numberOfSteps);
-}
-
-TEST(RunProgress, ExportStepsKeepTheirSignThroughThePackedValue) {
-  DexRunProgress progress;
-  progress.begin(DexRunProgress::EXPORT_RUN);
-  progress.setExportStep(-1, 7);
-  EXPECT_EQ(-1, progress.get().currentStep);
-  EXPECT_EQ(7, progress.get().numberOfSteps);
-  EXPECT_DOUBLE_EQ(0.0, progress.getFraction());
-}
-
-TEST(RunProgress, ExportFractionIsClampedWhenAnExporterMiscounts) {
-  DexRunProgress progress;
-  progress.begin(DexRunProgress::EXPORT_RUN);
-  progress.setExportStep(9, 3);
-  EXPECT_DOUBLE_EQ(1.0, progress.getFraction());
-  progress.setExportStep(-5, 3);
-  EXPECT_DOUBLE_EQ(0.0, progress.getFraction());
-}
-
-TEST(RunProgress, ImportFractionIsThePartOfTheFileRead) {
-  DexRunProgress progress;
+  const std::pair<int, double> steps[] = {{0, 0.25}, {3, 1.0}, {9, 1.0}, {-5, 0.0}, {-1, 0.0}};  // clamped
+  for (const auto& [step, fraction] : steps) {
+    progress.setExportStep(step, 4);
+    EXPECT_DOUBLE_EQ(fraction, progress.getFraction()) << step;
+  }
+  EXPECT_EQ(figuresOf(progress),
+            std::to_string(DexRunProgress::EXPORT_RUN) + " -1/4 0/0");  // the sign survives
   progress.begin(DexRunProgress::IMPORT_RUN);
+  progress.setImportPosition(300, 0);
+  EXPECT_LT(progress.getFraction(), 0.0);  // no total, no fraction
   progress.setImportPosition(250, 1000);
   EXPECT_DOUBLE_EQ(0.25, progress.getFraction());
   const std::uint64_t large = std::uint64_t{1} << 40;  // files beyond 4 GiB
@@ -60,39 +42,13 @@ TEST(RunProgress, ImportFractionIsThePartOfTheFileRead) {
   EXPECT_DOUBLE_EQ(0.5, progress.getFraction());
   progress.setImportPosition(1200, 1000);
   EXPECT_DOUBLE_EQ(1.0, progress.getFraction());
-}
-
-TEST(RunProgress, ImportWithoutATotalHasNoFraction) {
-  DexRunProgress progress;
-  progress.begin(DexRunProgress::IMPORT_RUN);
-  progress.setImportPosition(300, 0);
-  EXPECT_LT(progress.getFraction(), 0.0);
-  EXPECT_EQ(300u, progress.get().bytesRead);
-}
-
-TEST(RunProgress, BeginResetsTheFiguresOfThePreviousRun) {
-  DexRunProgress progress;
-  progress.begin(DexRunProgress::IMPORT_RUN);
-  progress.setImportPosition(10, 20);
   progress.setExportStep(1, 2);
-  progress.begin(DexRunProgress::EXPORT_RUN);
-  const DexRunProgress::Snapshot figures = progress.get();
-  EXPECT_EQ(DexRunProgress::EXPORT_RUN, figures.kind);
-  EXPECT_EQ(-2, figures.currentStep);
-  EXPECT_EQ(0, figures.numberOfSteps);
-  EXPECT_EQ(0u, figures.bytesRead);
-  EXPECT_EQ(0u, figures.bytesTotal);
-}
-
-TEST(RunProgress, CopiesTakeTheFiguresOfTheMoment) {
-  DexRunProgress progress;
-  progress.begin(DexRunProgress::EXPORT_RUN);
-  progress.setExportStep(1, 5);
-  DexRunProgress copy(progress);
-  progress.setExportStep(2, 5);
-  EXPECT_EQ(1, copy.get().currentStep);
+  DexRunProgress copy(progress);               // copies take the figures of the moment
+  progress.begin(DexRunProgress::EXPORT_RUN);  // begin resets the figures
+  EXPECT_EQ(figuresOf(progress), std::to_string(DexRunProgress::EXPORT_RUN) + " -2/0 0/0");
+  EXPECT_EQ(figuresOf(copy), std::to_string(DexRunProgress::IMPORT_RUN) + " 1/2 1200/1000");
   copy = progress;
-  EXPECT_EQ(2, copy.get().currentStep);
+  EXPECT_EQ(figuresOf(copy), figuresOf(progress));
 }
 
 // One thread publishes while another polls: every snapshot pairs a step with its own count.
@@ -114,3 +70,5 @@ TEST(RunProgress, PollingWhileAnotherThreadPublishesSeesConsistentSteps) {
   EXPECT_TRUE(consistent);
   EXPECT_DOUBLE_EQ(1.0, progress.getFraction());
 }
+
+}  // namespace

@@ -6,6 +6,9 @@
 #include <cstdlib>
 #include <fstream>
 #include <sstream>
+#include <string>
+#include <utility>
+#include <vector>
 
 #include "DxfTestModel.h"
 #include "hostlibs/winport.h"
@@ -82,6 +85,27 @@ TEST_F(DxfExport, ARoundTripKeepsEveryObjectLayerCodeAndColour) {
   const auto original = written("drawing.dxf");
   const auto back = readBack(dir_.file("drawing.dxf"));
   EXPECT_EQ(dxf_test::describe(*original->getIEData()), dxf_test::describe(*back->getIEData()));
+}
+
+TEST_F(DxfExport, EveryLineTypeAnnouncesAsManyDashElementsAsItLists) {
+  written("drawing.dxf");
+  std::istringstream text(dex_test::readFile(dir_.file("drawing.dxf")));
+  std::vector<std::pair<int, int>> announcedAndListed;  // per LTYPE entry
+  bool inLineType = false;
+  for (std::string code, value; std::getline(text, code) && std::getline(text, value);) {
+    const int group = std::stoi(code);
+    if (group == 0) {
+      inLineType = value == "LTYPE";
+      if (inLineType) announcedAndListed.emplace_back(-1, 0);
+    } else if (inLineType && group == 73) {
+      announcedAndListed.back().first = std::stoi(value);
+    } else if (inLineType && group == 49) {
+      ++announcedAndListed.back().second;
+    }
+  }
+  ASSERT_FALSE(announcedAndListed.empty());
+  for (const auto& [announced, listed] : announcedAndListed)
+    EXPECT_EQ(listed, announced);
 }
 
 TEST_F(DxfExport, CoordinatesAreWrittenInTheSettingsUnitAndReadBackToMeters) {

@@ -112,10 +112,10 @@ TEST_F(DxfImport, EachEntityBecomesItsModelObjectInWorldCoordinatesNorthingFirst
        {"text '' layer=T codes= color=- (6.000 5.000 0.000) '\xC3\x98"
         "50 \xC2\xB0%' h=2.000 rot=45.000 at=5"}},
       {"MTEXT in chunks, formatting removed",
-       entities("0 MTEXT|8 T|10 1|20 2|30 0|40 1.5|71 7|3 {\\fArial;Hel|3 lo}\\P|1 W\\U+00F6rld \\S1^2;|11 "
-                "0|21 1|31 0"),
-       {"text '' layer=T codes= color=- (2.000 1.000 0.000) 'Hello\nW\xC3\xB6rld 1/2' h=1.500 rot=90.000 "
-        "at=7"}},
+       entities("0 MTEXT|8 T|10 1|20 2|30 0|40 1.5|71 7|3 {\\fArial;Hel|3 lo}\\P|1 W\\U+00F6rld \\u+00FC "
+                "\\S1^2;|11 0|21 1|31 0"),
+       {"text '' layer=T codes= color=- (2.000 1.000 0.000) 'Hello\nW\xC3\xB6rld \xC3\xBC 1/2' h=1.500 "
+        "rot=90.000 at=7"}},
       {"entities without their section",
        dxf_test::groups("0 POINT|10 1|20 2|0 EOF"),
        {"point '' layer=0 codes= color=- (2.000 1.000 0.000)"}},
