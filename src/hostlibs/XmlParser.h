@@ -1,6 +1,8 @@
 #pragma once
 
+#include <functional>
 #include <memory>
+#include <string_view>
 
 #include "hostlibs/DexApi.h"
 #include "hostlibs/TextFile.h"
@@ -78,6 +80,12 @@ class DEX_API CXmlParserBase {
   // The unescaped value of the first attribute called name (exact, case-sensitive) in a serialised
   // attribute list; empty when there is none.
   static CVynStringT<wchar_t> ReadAttrib(const CVynStringT<wchar_t>& attributes, const wchar_t* name);
+  // Calls visit(name, value) for each attribute of a serialised attribute list, in order, with the value
+  // unescaped, until visit answers false. Both views are valid during the call only. For readers that
+  // take many attributes of many elements: one pass, and no string made for a value without references.
+  static void ForEachAttrib(
+      const CVynStringT<wchar_t>& attributes,
+      const std::function<bool(std::wstring_view name, std::wstring_view value)>& visit);
 
   // The encoding of the open document, judged from its start: UTF-16 when it begins with a UTF-16
   // byte-order mark or with "<?" in UTF-16; UTF-8 when it begins with the UTF-8 mark, or is 8-bit
