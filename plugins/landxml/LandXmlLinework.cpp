@@ -1,0 +1,236 @@
+// The PlanFeatures and Parcels handlers, and the counter of the road collections.
+
+#include <memory>
+
+#include "LandXmlHandlers.h"
+#include "ieObjects/IEData.h"
+#include "ieObjects/IEDataset.h"
+#include "ieObjects/IEHorizontalAlignment.h"
+#include "ieObjects/IEParcel.h"
+#include "ieObjects/IEPoints.h"
+#include "ieObjects/IEPolyLines.h"
+#include "ieObjects/IERegion.h"
+
+namespace vyn::ie::landxml {
+
+namespace {
+
+// Counts every attribute of an element as not held.
+void countAttributes(ReadContext& context, std::wstring_view element,
+                     const CVynStringT<wchar_t>& attributes) {
+  forEachAttribute(attributes, [&](std::wstring_view attribute, std::wstring_view /*value*/) {
+    context.notHeld(element, attribute);
+  });
+}
+
+// Reads the name attribute into name; every other attribute is counted as not held.
+void readName(ReadContext& context, std::wstring_view element, const CVynStringT<wchar_t>& attributes,
+              std::wstring& name) {
+  name.clear();
+  forEachAttribute(attributes, [&](std::wstring_view attribute, std::wstring_view value) {
+    if (attribute == attribute::kName) {
+      name.assign(value);
+    } else {
+      context.notHeld(element, attribute);
+    }
+  });
+}
+
+DexStation stationOf(const Vertex& vertex) {
+  DexStation station;
+  station.setPosition(vertex.north, vertex.east, vertex.height);
+  station.setBulge(vertex.bulge);
+  return station;
+}
+
+}  // namespace
+
+// ---- PlanFeatures --------------------------------------------------------------------------------
+
+bool PlanFeaturesHandler::start(const ElementPath& path, const CVynStringT<wchar_t>& attributes) {
+  if (geometryDepth_ > 0) return geometry_.start(path, attributes);
+  const std::wstring_view name = path.name();
+  if (name == element::kPlanFeatures) {
+    countAttributes(context_, name, attributes);
+    return true;
+  }
+  if (name == element::kPlanFeature && path.name(1) == element::kPlanFeatures) {
+    readName(context_, name, attributes, name_);
+    return true;
+  }
+  if (name == element::kCoordGeom && path.name(1) == element::kPlanFeature) {
+    countAttributes(context_, name, attributes);
+    geometry_.begin(path);
+    geometryDepth_ = path.depth();
+    return true;
+  }
+  return false;
+}
+
+void PlanFeaturesHandler::text(const ElementPath& path, std::wstring_view text) {
+  if (geometryDepth_ > 0) geometry_.text(path, text);
+}
+
+void PlanFeaturesHandler::end(const ElementPath& path) {
+  if (geometryDepth_ == 0) return;
+  if (path.depth() > geometryDepth_) {
+    geometry_.end(path);
+    return;
+  }
+  addPolylines();
+  geometryDepth_ = 0;
+}
+
+void PlanFeaturesHandler::addPolylines() {
+  CVynStringT<wchar_t>& name = context_.scratch();
+  point_files::assignText(name, name_);
+  for (Run& run : geometry_.runs()) {
+    std::vector<Vertex>& vertices = run.vertices;
+    if (vertices.size() < 2) {
+      context_.malformed(L"PlanFeature part of one point skipped", name_);
+      continue;
+    }
+    const bool closed = run.isClosed();
+    if (closed) vertices.pop_back();
+    bool pointMode = geometry_.onlyChains();
+    for (const Vertex& vertex : vertices)
+      pointMode = pointMode && vertex.point != nullptr;
+    auto polyline = std::make_unique<DexPolyLine>(pointMode);
+    polyline->setName(name);
+    polyline->setCloseStatus(closed);
+    for (const Vertex& vertex : vertices) {
+      if (pointMode) {
+        polyline->addPoint(vertex.point, vertex.bulge);
+      } else {
+        polyline->addStation(stationOf(vertex));
+      }
+    }
+    context_.dataset().add(polyline.release());
+  }
+}
+
+// ---- Parcels -------------------------------------------------------------------------------------
+
+bool ParcelsHandler::start(const ElementPath& path, const CVynStringT<wchar_t>& attributes) {
+  if (geometryDepth_ > 0) return geometry_.start(path, attributes);
+  const std::wstring_view name = path.name();
+  const std::wstring_view parent = path.name(1);
+  if (name == element::kParcels && (parent == element::kLandXml || parent == element::kParcel)) {
+    countAttributes(context_, name, attributes);
+    return true;
+  }
+  if (name == element::kParcel && parent == element::kParcels) {
+    startParcel(attributes);
+    return true;
+  }
+  if (open_.empty() || parent != element::kParcel) return false;
+  if (name == element::kCenter) {
+    center_.start(context_, name, attributes);
+    return true;
+  }
+  if (name == element::kCoordGeom) {
+    countAttributes(context_, name, attributes);
+    geometry_.begin(path);
+    geometryDepth_ = path.depth();
+    return true;
+  }
+  return false;
+}
+
+void ParcelsHandler::text(const ElementPath& path, std::wstring_view text) {
+  if (geometryDepth_ > 0) {
+    geometry_.text(path, text);
+  } else if (path.name() == element::kCenter) {
+    center_.text(text);
+  }
+}
+
+void ParcelsHandler::end(const ElementPath& path) {
+  if (geometryDepth_ > 0) {
+    if (path.depth() > geometryDepth_) {
+      geometry_.end(path);
+      return;
+    }
+    std::vector<Vertex>& boundary = open_.back().boundary;
+    for (const Run& run : geometry_.runs()) {
+      for (const Vertex& vertex : run.vertices) {
+        if (!boundary.empty() && isSamePosition(boundary.back(), vertex)) {
+          boundary.back().bulge = vertex.bulge;  // the joint of two runs
+          continue;
+        }
+        boundary.push_back(vertex);
+      }
+    }
+    geometryDepth_ = 0;
+    return;
+  }
+  const std::wstring_view name = path.name();
+  if (name == element::kCenter) {
+    endCenter();
+  } else if (name == element::kParcel) {
+    endParcel();
+  }
+}
+
+void ParcelsHandler::startParcel(const CVynStringT<wchar_t>& attributes) {
+  Parcel& parcel = open_.emplace_back();
+  readName(context_, element::kParcel, attributes, parcel.name);
+}
+
+void ParcelsHandler::endCenter() {
+  Parcel& parcel = open_.back();
+  Vertex center;
+  if (!center_.end(context_, element::kCenter, center)) return;
+  parcel.center = center;
+  parcel.hasCenter = true;
+  if (!center_.reference().empty()) parcel.centerPoint = context_.findPoint(center_.reference());
+}
+
+void ParcelsHandler::endParcel() {
+  Parcel parcel = std::move(open_.back());
+  open_.pop_back();
+  CVynStringT<wchar_t>& name = context_.scratch();
+  point_files::assignText(name, parcel.name);
+  auto added = std::make_unique<DexParcel>();
+  added->setName(name);
+  if (parcel.centerPoint == nullptr && parcel.hasCenter) {
+    auto point = std::make_unique<DexDesignPoint>();
+    point->setName(name);
+    point->setCoords(parcel.center.north, parcel.center.east, parcel.center.height);
+    parcel.centerPoint = point.get();
+    context_.dataset().add(point.release());
+    context_.addPoint(parcel.centerPoint);
+  }
+  added->setCentralPoint(parcel.centerPoint);
+  std::vector<Vertex>& boundary = parcel.boundary;
+  if (boundary.size() >= 2 && isSamePosition(boundary.front(), boundary.back())) boundary.pop_back();
+  if (!boundary.empty()) {
+    auto region = std::make_unique<DexRegion>();
+    region->setName(name);
+    region->setRegionType(kParcelBoundaryRegion);
+    for (const Vertex& vertex : boundary)
+      region->addVertex(DexPositionWithBulge(vertex.north, vertex.east,
+                                             vertex.height == kNoValue ? 0.0 : vertex.height, vertex.bulge));
+    auto alignment = std::make_unique<DexHorizontalAlignment>();
+    alignment->setName(name);
+    DexHorizontalAlignment* const link = alignment.get();
+    if (context_.data().getIEAlignmentPartsDictionary()->addAlignmentPart(alignment.get())) {
+      alignment.release();
+      added->setHAlignment(link);
+    }
+    context_.dataset().addRegion(region.release());
+  }
+  context_.dataset().add(added.release());
+}
+
+// ---- Roads ---------------------------------------------------------------------------------------
+
+bool RoadsCounter::start(const ElementPath& path, const CVynStringT<wchar_t>& /*attributes*/) {
+  const std::wstring_view name = path.name();
+  if (name == element::kAlignment || name == element::kProfile || name == element::kCrossSects ||
+      name == element::kStaEquation)
+    context_.notHeld(name);
+  return true;
+}
+
+}  // namespace vyn::ie::landxml
