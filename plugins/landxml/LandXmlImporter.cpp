@@ -54,6 +54,7 @@ EDexResult LandXmlImporter::doImport() {
 
   LandXmlReader reader(context);
   reader.addCollection(element::kUnits, units);
+  reader.skipCollection(element::kApplication);  // the program that wrote the file, not its data
   const auto collection = [&reader](std::wstring_view name, bool wanted, CollectionHandler& handler) {
     if (wanted) {
       reader.addCollection(name, handler);
