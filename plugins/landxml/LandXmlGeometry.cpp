@@ -69,14 +69,14 @@ bool PointReader::end(ReadContext& context, std::wstring_view element, Vertex& v
   vertex = Vertex();
   if (hasText_) {
     double values[3] = {};
-    const int count = readNumbers(text_, values, 3);
-    if (count < 2 || count > 3) {
+    const int count = context.readCoordinates(text_, values, 3);
+    if (count < 2) {
       context.malformed(std::wstring(element) + L" skipped, its text is not 2 or 3 numbers", text_);
       return false;
     }
-    vertex.north = context.toMeters(values[0]);
-    vertex.east = context.toMeters(values[1]);
-    if (count == 3) vertex.height = context.heightToMeters(values[2]);
+    vertex.north = values[0];
+    vertex.east = values[1];
+    if (count == 3) vertex.height = values[2];
     return true;
   }
   DexDesignPoint* const point = reference_.empty() ? nullptr : context.findPoint(reference_);
@@ -252,16 +252,16 @@ void CoordGeomReader::addCurve() {
 
 void CoordGeomReader::addIrregularLine() {
   const std::size_t dimension = static_cast<std::size_t>(listDimension_);
-  if (dimension == 0 || list_.size() % dimension != 0) {
+  if (dimension == 0 || list_.size() % dimension != 0 || !context_.toMeters(list_)) {
     context_.malformed(L"IrregularLine skipped, its point list is not whole points", L"");
     return;
   }
   Vertex previous = start_;
   for (std::size_t i = 0; i < list_.size(); i += dimension) {
     Vertex vertex;
-    vertex.north = context_.toMeters(list_[i]);
-    vertex.east = context_.toMeters(list_[i + 1]);
-    if (dimension == 3) vertex.height = context_.heightToMeters(list_[i + 2]);
+    vertex.north = list_[i];
+    vertex.east = list_[i + 1];
+    if (dimension == 3) vertex.height = list_[i + 2];
     if (!isSamePosition(previous, vertex)) addSegment(previous, vertex, 0.0);
     previous = vertex;
   }

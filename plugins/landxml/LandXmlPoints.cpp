@@ -127,11 +127,11 @@ bool CgPointsHandler::readCoordinates(double& north, double& east, double& heigh
   north = east = height = kNoValue;
   if (hasText_) {
     double values[3] = {};
-    const int count = readNumbers(text_, values, 3);
-    if (count == 2 || count == 3) {
-      north = context_.toMeters(values[0]);
-      east = context_.toMeters(values[1]);
-      if (count == 3) height = context_.heightToMeters(values[2]);
+    const int count = context_.readCoordinates(text_, values, 3);
+    if (count >= 2) {
+      north = values[0];
+      east = values[1];
+      if (count == 3) height = values[2];
       return true;
     }
     context_.malformed(L"CgPoint skipped, its text is not 2 or 3 numbers", name_ + L": " + text_);

@@ -1,6 +1,9 @@
 #include "LandXmlReader.h"
 
 #include <algorithm>
+#include <cmath>
+
+#include "LandXmlText.h"
 
 #include "hostlibs/VynLogging.h"
 #include "ieObjects/IEData.h"
@@ -45,12 +48,27 @@ ReadContext::ReadContext(DexData& data, const CVynStringT<wchar_t>& fileName)
 
 ReadContext::~ReadContext() = default;
 
-double ReadContext::toMeters(double value) const {
-  return utils::toMetersFactor(value, units_.linear);
+namespace {
+
+// value in meters, false when it is not a finite number other than the no-value marker.
+bool convert(double& value, EDistUnits units) {
+  value = utils::toMetersFactor(value, units);
+  return std::isfinite(value) && std::fabs(value) < kNoValue;
 }
 
-double ReadContext::heightToMeters(double value) const {
-  return utils::toMetersFactor(value, units_.linear);
+}  // namespace
+
+int ReadContext::readCoordinates(std::wstring_view text, double* meters, int capacity) const {
+  const int count = readNumbers(text, meters, capacity);
+  if (count < 0 || count > capacity) return -1;
+  for (int i = 0; i < count; ++i) {
+    if (!convert(meters[i], units_.linear)) return -1;
+  }
+  return count;
+}
+
+bool ReadContext::toMeters(std::vector<double>& values) const {
+  return std::all_of(values.begin(), values.end(), [this](double& value) { return convert(value, units_.linear); });
 }
 
 void ReadContext::notHeld(std::wstring_view element) {

@@ -54,8 +54,12 @@ class ReadContext {
 
   // ---- Units ---------------------------------------------------------------------------------
   FileUnits& units() noexcept { return units_; }
-  double toMeters(double value) const;
-  double heightToMeters(double value) const;
+  // Reads the numbers of text (readNumbers) and converts them from the file's linear unit to meters.
+  // Answers the count, or -1 when a word is not a number, there are more than capacity or a value
+  // does not convert to a finite number of meters (other than the no-value marker).
+  int readCoordinates(std::wstring_view text, double* meters, int capacity) const;
+  // Converts values in place; false when one does not convert to a finite number of meters.
+  bool toMeters(std::vector<double>& values) const;
 
   // ---- Tallies -------------------------------------------------------------------------------
   // An element the model cannot hold (with everything in it), counted by name.

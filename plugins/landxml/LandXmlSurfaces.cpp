@@ -148,15 +148,15 @@ void SurfacesHandler::endBreakline() {
   std::unique_ptr<DexBreakline> breakline = std::move(breakline_);
   if (!breakline || breaklineDimension_ < 0) return;
   const auto dimension = static_cast<std::size_t>(breaklineDimension_);
-  if (dimension == 0 || breaklineValues_.size() % dimension != 0 || breaklineValues_.size() < 2 * dimension) {
+  if (dimension == 0 || breaklineValues_.size() % dimension != 0 || breaklineValues_.size() < 2 * dimension ||
+      !context_.toMeters(breaklineValues_)) {
     context_.malformed(L"Breakline skipped, its point list is not two whole points or more",
                        breakline->getName().view());
     return;
   }
   for (std::size_t i = 0; i < breaklineValues_.size(); i += dimension) {
     DexStation station;
-    station.setPosition(context_.toMeters(breaklineValues_[i]), context_.toMeters(breaklineValues_[i + 1]),
-                        dimension == 3 ? context_.heightToMeters(breaklineValues_[i + 2]) : kNoValue);
+    station.setPosition(breaklineValues_[i], breaklineValues_[i + 1], dimension == 3 ? breaklineValues_[i + 2] : kNoValue);
     breakline->addStation(station);
   }
   DexBreakline* const added = breakline.get();
@@ -170,7 +170,7 @@ void SurfacesHandler::addPosition(std::int64_t id, std::wstring_view text) {
     context_.malformed(L"surface point skipped, it has no id above 0", text);
     return;
   }
-  if (readNumbers(text, values, 3) != 3) {
+  if (context_.readCoordinates(text, values, 3) != 3) {
     context_.malformed(L"surface point skipped, its text is not 3 numbers", text);
     return;
   }
@@ -178,8 +178,7 @@ void SurfacesHandler::addPosition(std::int64_t id, std::wstring_view text) {
     context_.malformed(L"surface point skipped, its id was given before", text);
     return;
   }
-  const int index = surface_->addPosition(DexPosition3D(
-      context_.toMeters(values[0]), context_.toMeters(values[1]), context_.heightToMeters(values[2])));
+  const int index = surface_->addPosition(DexPosition3D(values[0], values[1], values[2]));
   if (id <= kDenseIdFactor * static_cast<std::int64_t>(positionsById_.size()) + kDenseIdMargin) {
     if (static_cast<std::size_t>(id) >= positionsById_.size())
       positionsById_.resize(static_cast<std::size_t>(id) + 1, 0);

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 #include <charconv>
+#include <cmath>
 
 #include "hostlibs/XmlParser.h"
 #include "pointfiles/LineValues.h"
@@ -10,6 +11,9 @@
 namespace vyn::ie::landxml {
 
 namespace {
+
+// Numbers of this magnitude and more are written in the shortest form that reads back exactly.
+constexpr double kLargestFixed = 1e15;
 
 constexpr bool isBlank(wchar_t ch) noexcept {
   return ch == L' ' || ch == L'\t' || ch == L'\r' || ch == L'\n';
@@ -128,9 +132,16 @@ void XmlText::text(std::wstring_view value) {
 }
 
 void XmlText::number(double value, int decimals) {
-  std::array<char, 400> digits{};  // fixed notation of the largest double with every decimal
+  if (!std::isfinite(value)) {  // the lexical forms of xs:double, which no reader takes for a coordinate
+    bytes_ += std::isnan(value) ? "NaN" : value > 0 ? "INF" : "-INF";
+    return;
+  }
+  std::array<char, 64> digits{};
+  // Beyond survey magnitudes fixed notation would write hundreds of digits: the shortest exact form.
   const auto written =
-      std::to_chars(digits.data(), digits.data() + digits.size(), value, std::chars_format::fixed, decimals);
+      std::fabs(value) < kLargestFixed
+          ? std::to_chars(digits.data(), digits.data() + digits.size(), value, std::chars_format::fixed, decimals)
+          : std::to_chars(digits.data(), digits.data() + digits.size(), value);
   bytes_.append(digits.data(), written.ptr);
 }
 
