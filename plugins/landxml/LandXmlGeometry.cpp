@@ -47,7 +47,7 @@ bool Run::isClosed() const {
 // ---- PointReader -------------------------------------------------------------------------------
 
 void PointReader::start(ReadContext& context, std::wstring_view element,
-                        const CVynStringT<wchar_t>& attributes) {
+                        std::wstring_view attributes) {
   text_.clear();
   reference_.clear();
   hasText_ = false;
@@ -99,7 +99,7 @@ void CoordGeomReader::begin(const ElementPath& path) {
   kind_ = Kind::NONE;
 }
 
-bool CoordGeomReader::start(const ElementPath& path, const CVynStringT<wchar_t>& attributes) {
+bool CoordGeomReader::start(const ElementPath& path, std::wstring_view attributes) {
   const std::wstring_view name = path.name();
   if (level(path) == 1) {
     startElement(name, attributes);
@@ -117,7 +117,7 @@ bool CoordGeomReader::start(const ElementPath& path, const CVynStringT<wchar_t>&
   return true;
 }
 
-void CoordGeomReader::startElement(std::wstring_view name, const CVynStringT<wchar_t>& attributes) {
+void CoordGeomReader::startElement(std::wstring_view name, std::wstring_view attributes) {
   kind_ = name == element::kLine            ? Kind::LINE
           : name == element::kCurve         ? Kind::CURVE
           : name == element::kIrregularLine ? Kind::IRREGULAR_LINE

@@ -44,7 +44,7 @@ class PointReader {
  public:
   // At the start tag: the attributes of element (pntRef; name, code and the others are counted as not
   // held).
-  void start(ReadContext& context, std::wstring_view element, const CVynStringT<wchar_t>& attributes);
+  void start(ReadContext& context, std::wstring_view element, std::wstring_view attributes);
   void text(std::wstring_view text);
   // At the end tag: false, with a malformed record, when the text is not two or three numbers or the
   // reference names no point read before (and the element has no text of its own).
@@ -75,7 +75,7 @@ class CoordGeomReader {
   explicit CoordGeomReader(ReadContext& context) : context_(context) {}
 
   void begin(const ElementPath& path);
-  bool start(const ElementPath& path, const CVynStringT<wchar_t>& attributes);
+  bool start(const ElementPath& path, std::wstring_view attributes);
   void text(const ElementPath& path, std::wstring_view text);
   void end(const ElementPath& path);
 
@@ -87,7 +87,7 @@ class CoordGeomReader {
   enum class Kind { NONE, LINE, CURVE, IRREGULAR_LINE, CHAIN };
 
   int level(const ElementPath& path) const noexcept { return path.depth() - base_; }
-  void startElement(std::wstring_view name, const CVynStringT<wchar_t>& attributes);
+  void startElement(std::wstring_view name, std::wstring_view attributes);
   void endElement();
   void addCurve();
   void addIrregularLine();

@@ -29,7 +29,7 @@ namespace vyn::ie::landxml {
 class UnitsHandler final : public CollectionHandler {
  public:
   UnitsHandler(ReadContext& context, const FileUnits& fallback);
-  bool start(const ElementPath& path, const CVynStringT<wchar_t>& attributes) override;
+  bool start(const ElementPath& path, std::wstring_view attributes) override;
 
  private:
   ReadContext& context_;
@@ -46,13 +46,13 @@ class UnitsHandler final : public CollectionHandler {
 class CgPointsHandler final : public CollectionHandler {
  public:
   CgPointsHandler(ReadContext& context, bool withLists);
-  bool start(const ElementPath& path, const CVynStringT<wchar_t>& attributes) override;
+  bool start(const ElementPath& path, std::wstring_view attributes) override;
   void text(const ElementPath& path, std::wstring_view text) override;
   void end(const ElementPath& path) override;
 
  private:
-  void startGroup(const CVynStringT<wchar_t>& attributes);
-  void startPoint(const CVynStringT<wchar_t>& attributes);
+  void startGroup(std::wstring_view attributes);
+  void startPoint(std::wstring_view attributes);
   void endPoint();
   bool readCoordinates(double& north, double& east, double& height);
   void addCodes(DexDesignPoint& point);
@@ -78,7 +78,7 @@ class CgPointsHandler final : public CollectionHandler {
 class PlanFeaturesHandler final : public CollectionHandler {
  public:
   explicit PlanFeaturesHandler(ReadContext& context) : context_(context), geometry_(context) {}
-  bool start(const ElementPath& path, const CVynStringT<wchar_t>& attributes) override;
+  bool start(const ElementPath& path, std::wstring_view attributes) override;
   void text(const ElementPath& path, std::wstring_view text) override;
   void end(const ElementPath& path) override;
 
@@ -99,13 +99,13 @@ class PlanFeaturesHandler final : public CollectionHandler {
 class SurfacesHandler final : public CollectionHandler {
  public:
   explicit SurfacesHandler(ReadContext& context) : context_(context) {}
-  bool start(const ElementPath& path, const CVynStringT<wchar_t>& attributes) override;
+  bool start(const ElementPath& path, std::wstring_view attributes) override;
   void text(const ElementPath& path, std::wstring_view text) override;
   void end(const ElementPath& path) override;
 
  private:
-  void startSurface(const CVynStringT<wchar_t>& attributes);
-  void startBreakline(const CVynStringT<wchar_t>& attributes);
+  void startSurface(std::wstring_view attributes);
+  void startBreakline(std::wstring_view attributes);
   void addPosition(std::int64_t id, std::wstring_view text);
   void addFace(std::wstring_view text);
   void endBreakline();
@@ -130,7 +130,7 @@ class SurfacesHandler final : public CollectionHandler {
 class ParcelsHandler final : public CollectionHandler {
  public:
   explicit ParcelsHandler(ReadContext& context) : context_(context), geometry_(context) {}
-  bool start(const ElementPath& path, const CVynStringT<wchar_t>& attributes) override;
+  bool start(const ElementPath& path, std::wstring_view attributes) override;
   void text(const ElementPath& path, std::wstring_view text) override;
   void end(const ElementPath& path) override;
 
@@ -143,7 +143,7 @@ class ParcelsHandler final : public CollectionHandler {
     std::vector<Vertex> boundary;
   };
 
-  void startParcel(const CVynStringT<wchar_t>& attributes);
+  void startParcel(std::wstring_view attributes);
   void endCenter();
   void endParcel();
 
@@ -159,7 +159,7 @@ class ParcelsHandler final : public CollectionHandler {
 class RoadsCounter final : public CollectionHandler {
  public:
   explicit RoadsCounter(ReadContext& context) : context_(context) {}
-  bool start(const ElementPath& path, const CVynStringT<wchar_t>& attributes) override;
+  bool start(const ElementPath& path, std::wstring_view attributes) override;
 
  private:
   ReadContext& context_;

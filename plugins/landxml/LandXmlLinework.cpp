@@ -17,14 +17,14 @@ namespace {
 
 // Counts every attribute of an element as not held.
 void countAttributes(ReadContext& context, std::wstring_view element,
-                     const CVynStringT<wchar_t>& attributes) {
+                     std::wstring_view attributes) {
   forEachAttribute(attributes, [&](std::wstring_view attribute, std::wstring_view /*value*/) {
     context.notHeld(element, attribute);
   });
 }
 
 // Reads the name attribute into name; every other attribute is counted as not held.
-void readName(ReadContext& context, std::wstring_view element, const CVynStringT<wchar_t>& attributes,
+void readName(ReadContext& context, std::wstring_view element, std::wstring_view attributes,
               std::wstring& name) {
   name.clear();
   forEachAttribute(attributes, [&](std::wstring_view attribute, std::wstring_view value) {
@@ -47,7 +47,7 @@ DexStation stationOf(const Vertex& vertex) {
 
 // ---- PlanFeatures --------------------------------------------------------------------------------
 
-bool PlanFeaturesHandler::start(const ElementPath& path, const CVynStringT<wchar_t>& attributes) {
+bool PlanFeaturesHandler::start(const ElementPath& path, std::wstring_view attributes) {
   if (geometryDepth_ > 0) return geometry_.start(path, attributes);
   const std::wstring_view name = path.name();
   if (name == element::kPlanFeatures) {
@@ -111,7 +111,7 @@ void PlanFeaturesHandler::addPolylines() {
 
 // ---- Parcels -------------------------------------------------------------------------------------
 
-bool ParcelsHandler::start(const ElementPath& path, const CVynStringT<wchar_t>& attributes) {
+bool ParcelsHandler::start(const ElementPath& path, std::wstring_view attributes) {
   if (geometryDepth_ > 0) return geometry_.start(path, attributes);
   const std::wstring_view name = path.name();
   const std::wstring_view parent = path.name(1);
@@ -172,7 +172,7 @@ void ParcelsHandler::end(const ElementPath& path) {
   }
 }
 
-void ParcelsHandler::startParcel(const CVynStringT<wchar_t>& attributes) {
+void ParcelsHandler::startParcel(std::wstring_view attributes) {
   Parcel& parcel = open_.emplace_back();
   readName(context_, element::kParcel, attributes, parcel.name);
 }
@@ -225,7 +225,7 @@ void ParcelsHandler::endParcel() {
 
 // ---- Roads ---------------------------------------------------------------------------------------
 
-bool RoadsCounter::start(const ElementPath& path, const CVynStringT<wchar_t>& /*attributes*/) {
+bool RoadsCounter::start(const ElementPath& path, std::wstring_view /*attributes*/) {
   const std::wstring_view name = path.name();
   if (name == element::kAlignment || name == element::kProfile || name == element::kCrossSects ||
       name == element::kStaEquation)

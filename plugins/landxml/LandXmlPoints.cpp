@@ -19,7 +19,7 @@ UnitsHandler::UnitsHandler(ReadContext& context, const FileUnits& fallback) : co
   context_.units() = fallback;
 }
 
-bool UnitsHandler::start(const ElementPath& path, const CVynStringT<wchar_t>& attributes) {
+bool UnitsHandler::start(const ElementPath& path, std::wstring_view attributes) {
   const std::wstring_view name = path.name();
   if (name == element::kUnits) return true;
   if (name != element::kMetric && name != element::kImperial) return false;
@@ -51,7 +51,7 @@ bool UnitsHandler::start(const ElementPath& path, const CVynStringT<wchar_t>& at
 CgPointsHandler::CgPointsHandler(ReadContext& context, bool withLists)
     : context_(context), withLists_(withLists), codes_(&context.data()) {}
 
-bool CgPointsHandler::start(const ElementPath& path, const CVynStringT<wchar_t>& attributes) {
+bool CgPointsHandler::start(const ElementPath& path, std::wstring_view attributes) {
   const std::wstring_view name = path.name();
   if (name == element::kCgPoints) {
     startGroup(attributes);
@@ -76,7 +76,7 @@ void CgPointsHandler::end(const ElementPath& path) {
   }
 }
 
-void CgPointsHandler::startGroup(const CVynStringT<wchar_t>& attributes) {
+void CgPointsHandler::startGroup(std::wstring_view attributes) {
   DexObjectList* list = nullptr;
   forEachAttribute(attributes, [&](std::wstring_view attribute, std::wstring_view value) {
     if (attribute != attribute::kName || !withLists_) {
@@ -96,7 +96,7 @@ void CgPointsHandler::startGroup(const CVynStringT<wchar_t>& attributes) {
   groups_.push_back(list);
 }
 
-void CgPointsHandler::startPoint(const CVynStringT<wchar_t>& attributes) {
+void CgPointsHandler::startPoint(std::wstring_view attributes) {
   name_.clear();
   code_.clear();
   desc_.clear();

@@ -168,9 +168,9 @@ const LandXmlReader::Collection* LandXmlReader::findCollection(std::wstring_view
 }
 
 EDexResult LandXmlReader::read(CXmlParserBase& parser) {
-  CVynStringT<wchar_t> tag;
-  CVynStringT<wchar_t> attributes;
-  CVynStringT<wchar_t> value;
+  std::wstring_view tag;
+  std::wstring_view attributes;
+  std::wstring_view value;
   bool rootClosed = false;
   bool stopped = false;
   std::int64_t tokens = 0;
@@ -179,7 +179,7 @@ EDexResult LandXmlReader::read(CXmlParserBase& parser) {
       stopped = true;
       break;
     }
-    const std::wstring_view name = tag.view();
+    const std::wstring_view name = tag;
     if (name.empty()) continue;  // the XML declaration
     if (name.front() == L'/') {
       endElement();
@@ -189,8 +189,8 @@ EDexResult LandXmlReader::read(CXmlParserBase& parser) {
       }
       continue;
     }
-    if (!value.IsEmpty()) {
-      if (skipDepth_ == 0 && current_ != nullptr) current_->handler->text(path_, value.view());
+    if (!value.empty()) {
+      if (skipDepth_ == 0 && current_ != nullptr) current_->handler->text(path_, value);
       continue;
     }
     if (path_.depth() == 0) {
@@ -221,7 +221,7 @@ EDexResult LandXmlReader::read(CXmlParserBase& parser) {
   return rootClosed ? DEX_RESULT_OK : kResultTruncated;
 }
 
-void LandXmlReader::startElement(const CVynStringT<wchar_t>& attributes) {
+void LandXmlReader::startElement(std::wstring_view attributes) {
   if (skipDepth_ > 0) return;
   const int depth = path_.depth();
   if (depth == kCollectionDepth) {

@@ -102,8 +102,8 @@ class ReadContext {
 
 // Calls visit(name, value) for every attribute of a serialised attribute list.
 template <class Visit>
-void forEachAttribute(const CVynStringT<wchar_t>& attributes, Visit&& visit) {
-  if (attributes.IsEmpty()) return;
+void forEachAttribute(std::wstring_view attributes, Visit&& visit) {
+  if (attributes.empty()) return;
   CXmlParserBase::ForEachAttrib(attributes, [&](std::wstring_view name, std::wstring_view value) {
     visit(name, value);
     return true;
@@ -119,7 +119,7 @@ class CollectionHandler {
 
   // A start tag. False when the element is not read: it is counted as not held and read over with
   // all it holds.
-  virtual bool start(const ElementPath& path, const CVynStringT<wchar_t>& attributes) = 0;
+  virtual bool start(const ElementPath& path, std::wstring_view attributes) = 0;
   // The text of the innermost element.
   virtual void text(const ElementPath& path, std::wstring_view text);
   // The end tag of the innermost element (path still holds it).
@@ -152,7 +152,7 @@ class LandXmlReader {
   };
 
   const Collection* findCollection(std::wstring_view name) const;
-  void startElement(const CVynStringT<wchar_t>& attributes);
+  void startElement(std::wstring_view attributes);
   void endElement();
 
   ReadContext& context_;

@@ -21,7 +21,7 @@ constexpr int kMostCorners = 4;
 
 }  // namespace
 
-bool SurfacesHandler::start(const ElementPath& path, const CVynStringT<wchar_t>& attributes) {
+bool SurfacesHandler::start(const ElementPath& path, std::wstring_view attributes) {
   const std::wstring_view name = path.name();
   const std::wstring_view parent = path.name(1);
   if (name == element::kSurfaces) {
@@ -105,7 +105,7 @@ void SurfacesHandler::end(const ElementPath& path) {
   }
 }
 
-void SurfacesHandler::startSurface(const CVynStringT<wchar_t>& attributes) {
+void SurfacesHandler::startSurface(std::wstring_view attributes) {
   auto surface = std::make_unique<DexSurface>();
   forEachAttribute(attributes, [&](std::wstring_view attribute, std::wstring_view value) {
     if (attribute == attribute::kName) {
@@ -122,7 +122,7 @@ void SurfacesHandler::startSurface(const CVynStringT<wchar_t>& attributes) {
   sparsePositions_.clear();
 }
 
-void SurfacesHandler::startBreakline(const CVynStringT<wchar_t>& attributes) {
+void SurfacesHandler::startBreakline(std::wstring_view attributes) {
   breakline_ = std::make_unique<DexBreakline>(surface_->getName());
   breaklineValues_.clear();
   breaklineDimension_ = 0;

@@ -83,6 +83,18 @@ bool CXmlParserBase::ReadToken(String& tag, String& attributes, String& value) {
   return true;
 }
 
+bool CXmlParserBase::ReadToken(std::wstring_view& tag, std::wstring_view& attributes, std::wstring_view& value) {
+  const vyn_text::detail::XmlToken* const token = reader_ != nullptr ? reader_->next() : nullptr;
+  if (token == nullptr) {
+    tag = attributes = value = std::wstring_view();
+    return false;
+  }
+  tag = token->tag;
+  attributes = token->attributes;
+  value = token->value;
+  return true;
+}
+
 String CXmlParserBase::ReadAttrib(const String& attributes, const wchar_t* name) {
   const std::wstring_view wanted = viewOf(name);
   std::wstring found;
@@ -94,10 +106,10 @@ String CXmlParserBase::ReadAttrib(const String& attributes, const wchar_t* name)
   return stringOf(found);
 }
 
-void CXmlParserBase::ForEachAttrib(const String& attributes,
+void CXmlParserBase::ForEachAttrib(std::wstring_view attributes,
                                    const std::function<bool(std::wstring_view, std::wstring_view)>& visit) {
   std::wstring unescaped;
-  vyn_text::detail::forEachXmlAttribute(attributes.view(), [&](std::wstring_view key, std::wstring_view raw) {
+  vyn_text::detail::forEachXmlAttribute(attributes, [&](std::wstring_view key, std::wstring_view raw) {
     if (raw.find(L'&') == std::wstring_view::npos) return visit(key, raw);
     unescaped = vyn_text::detail::unescapeXml(raw);
     return visit(key, unescaped);
