@@ -46,8 +46,7 @@ bool Run::isClosed() const {
 
 // ---- PointReader -------------------------------------------------------------------------------
 
-void PointReader::start(ReadContext& context, std::wstring_view element,
-                        std::wstring_view attributes) {
+void PointReader::start(ReadContext& context, std::wstring_view element, std::wstring_view attributes) {
   text_.clear();
   reference_.clear();
   hasText_ = false;
@@ -92,7 +91,8 @@ bool PointReader::end(ReadContext& context, std::wstring_view element, Vertex& v
 
 // ---- CoordGeomReader ---------------------------------------------------------------------------
 
-void CoordGeomReader::begin(const ElementPath& path) {
+void CoordGeomReader::begin(const ElementPath& path, std::wstring_view attributes) {
+  context_.notHeldAttributes(element::kCoordGeom, attributes);
   base_ = path.depth();
   runs_.clear();
   onlyChains_ = true;
@@ -157,20 +157,24 @@ void CoordGeomReader::text(const ElementPath& path, std::wstring_view text) {
   }
 }
 
-void CoordGeomReader::end(const ElementPath& path) {
-  if (kind_ == Kind::NONE) return;
+bool CoordGeomReader::end(const ElementPath& path) {
+  if (level(path) == 0) {
+    base_ = 0;
+    return true;
+  }
+  if (kind_ == Kind::NONE) return false;
   if (level(path) == 1) {
     endElement();
     kind_ = Kind::NONE;
-    return;
+    return false;
   }
-  if (level(path) != 2) return;
+  if (level(path) != 2) return false;
   const std::wstring_view name = path.name();
-  if (name == element::kPntList2D || name == element::kPntList3D) return;
+  if (name == element::kPntList2D || name == element::kPntList3D) return false;
   Vertex vertex;
   if (!point_.end(context_, name, vertex)) {
     broken_ = true;
-    return;
+    return false;
   }
   if (name == element::kStart) {
     start_ = vertex;
@@ -185,6 +189,7 @@ void CoordGeomReader::end(const ElementPath& path) {
     pi_ = vertex;
     hasPi_ = true;
   }
+  return false;
 }
 
 void CoordGeomReader::endElement() {

@@ -58,8 +58,9 @@ class PointReader {
   bool hasText_ = false;
 };
 
-// Reads the elements of one CoordGeom. The owner calls begin() at the CoordGeom start tag and then
-// hands on every element inside it; at the CoordGeom end tag runs() holds the geometry.
+// Reads the elements of one CoordGeom. The owner calls begin() at the CoordGeom start tag and, while
+// isOpen(), hands on every element inside it and the CoordGeom's own end tag; when end() answers true
+// (the CoordGeom ended) runs() holds the geometry.
 //  - Line: its Start and End.
 //  - Curve: the bulge from Start, Center, End and rot (without Center: from the tangents through PI,
 //    or from the radius as the minor arc); a full circle (Start on End) becomes two half arcs; a zero
@@ -74,10 +75,12 @@ class CoordGeomReader {
  public:
   explicit CoordGeomReader(ReadContext& context) : context_(context) {}
 
-  void begin(const ElementPath& path);
+  // The CoordGeom's attributes are counted as not held.
+  void begin(const ElementPath& path, std::wstring_view attributes);
+  bool isOpen() const noexcept { return base_ > 0; }
   bool start(const ElementPath& path, std::wstring_view attributes);
   void text(const ElementPath& path, std::wstring_view text);
-  void end(const ElementPath& path);
+  bool end(const ElementPath& path);
 
   std::vector<Run>& runs() noexcept { return runs_; }
   // True when every vertex read came from a Chain.

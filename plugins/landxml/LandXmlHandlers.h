@@ -88,7 +88,6 @@ class PlanFeaturesHandler final : public CollectionHandler {
   ReadContext& context_;
   CoordGeomReader geometry_;
   std::wstring name_;
-  int geometryDepth_ = 0;  // depth of the CoordGeom being read, 0 outside one
 };
 
 // Surfaces: one surface per Surface, named by name; its Definition's Pnts become positions (by id) and
@@ -145,13 +144,13 @@ class ParcelsHandler final : public CollectionHandler {
 
   void startParcel(std::wstring_view attributes);
   void endCenter();
+  void addBoundary();
   void endParcel();
 
   ReadContext& context_;
   CoordGeomReader geometry_;
   PointReader center_;
   std::vector<Parcel> open_;  // the parcels being read, innermost last
-  int geometryDepth_ = 0;
 };
 
 // The road collections (Alignments with their Profile, CrossSects and StaEquation) that the model's

@@ -38,15 +38,19 @@ LandXmlImporter::~LandXmlImporter() = default;
 EDexResult LandXmlImporter::doImport() {
   if (data == nullptr) return DEX_RESULT_FAILED;
   if (!isLandXmlFormat(format)) return DEX_RESULT_NO_PARSER;
+  const DexSettings& settings = data->getSettings();
+  const bool points = settings.hasDataType(POINTS) || settings.hasDataType(POINT_LISTS);
+  if (!points && !settings.hasDataType(LINES) && !settings.hasDataType(SURFACES) &&
+      !settings.hasDataType(PARCELS) && !wantsRoads(settings))
+    return DEX_RESULT_OK;  // nothing the plug-in reads is asked for
   DexXmlParser* opened = nullptr;
   const EDexResult openResult = DexXmlParser::initialize(fileName, opened);
   if (openResult != DEX_RESULT_OK) return openResult;
   const std::unique_ptr<DexXmlParser> parser(opened);
 
-  const DexSettings& settings = data->getSettings();
   ReadContext context(*data, fileName);
   UnitsHandler units(context, fallbackUnits(settings));
-  CgPointsHandler points(context, settings.hasDataType(POINT_LISTS));
+  CgPointsHandler pointsHandler(context, settings.hasDataType(POINT_LISTS));
   PlanFeaturesHandler features(context);
   SurfacesHandler surfaces(context);
   ParcelsHandler parcels(context);
@@ -62,7 +66,7 @@ EDexResult LandXmlImporter::doImport() {
       reader.skipCollection(name);
     }
   };
-  collection(element::kCgPoints, settings.hasDataType(POINTS) || settings.hasDataType(POINT_LISTS), points);
+  collection(element::kCgPoints, points, pointsHandler);
   collection(element::kPlanFeatures, settings.hasDataType(LINES), features);
   collection(element::kSurfaces, settings.hasDataType(SURFACES), surfaces);
   collection(element::kParcels, settings.hasDataType(PARCELS), parcels);

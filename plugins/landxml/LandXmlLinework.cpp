@@ -15,14 +15,6 @@ namespace vyn::ie::landxml {
 
 namespace {
 
-// Counts every attribute of an element as not held.
-void countAttributes(ReadContext& context, std::wstring_view element,
-                     std::wstring_view attributes) {
-  forEachAttribute(attributes, [&](std::wstring_view attribute, std::wstring_view /*value*/) {
-    context.notHeld(element, attribute);
-  });
-}
-
 // Reads the name attribute into name; every other attribute is counted as not held.
 void readName(ReadContext& context, std::wstring_view element, std::wstring_view attributes,
               std::wstring& name) {
@@ -48,10 +40,10 @@ DexStation stationOf(const Vertex& vertex) {
 // ---- PlanFeatures --------------------------------------------------------------------------------
 
 bool PlanFeaturesHandler::start(const ElementPath& path, std::wstring_view attributes) {
-  if (geometryDepth_ > 0) return geometry_.start(path, attributes);
+  if (geometry_.isOpen()) return geometry_.start(path, attributes);
   const std::wstring_view name = path.name();
   if (name == element::kPlanFeatures) {
-    countAttributes(context_, name, attributes);
+    context_.notHeldAttributes(name, attributes);
     return true;
   }
   if (name == element::kPlanFeature && path.name(1) == element::kPlanFeatures) {
@@ -59,26 +51,18 @@ bool PlanFeaturesHandler::start(const ElementPath& path, std::wstring_view attri
     return true;
   }
   if (name == element::kCoordGeom && path.name(1) == element::kPlanFeature) {
-    countAttributes(context_, name, attributes);
-    geometry_.begin(path);
-    geometryDepth_ = path.depth();
+    geometry_.begin(path, attributes);
     return true;
   }
   return false;
 }
 
 void PlanFeaturesHandler::text(const ElementPath& path, std::wstring_view text) {
-  if (geometryDepth_ > 0) geometry_.text(path, text);
+  if (geometry_.isOpen()) geometry_.text(path, text);
 }
 
 void PlanFeaturesHandler::end(const ElementPath& path) {
-  if (geometryDepth_ == 0) return;
-  if (path.depth() > geometryDepth_) {
-    geometry_.end(path);
-    return;
-  }
-  addPolylines();
-  geometryDepth_ = 0;
+  if (geometry_.isOpen() && geometry_.end(path)) addPolylines();
 }
 
 void PlanFeaturesHandler::addPolylines() {
@@ -112,11 +96,11 @@ void PlanFeaturesHandler::addPolylines() {
 // ---- Parcels -------------------------------------------------------------------------------------
 
 bool ParcelsHandler::start(const ElementPath& path, std::wstring_view attributes) {
-  if (geometryDepth_ > 0) return geometry_.start(path, attributes);
+  if (geometry_.isOpen()) return geometry_.start(path, attributes);
   const std::wstring_view name = path.name();
   const std::wstring_view parent = path.name(1);
   if (name == element::kParcels && (parent == element::kLandXml || parent == element::kParcel)) {
-    countAttributes(context_, name, attributes);
+    context_.notHeldAttributes(name, attributes);
     return true;
   }
   if (name == element::kParcel && parent == element::kParcels) {
@@ -129,16 +113,14 @@ bool ParcelsHandler::start(const ElementPath& path, std::wstring_view attributes
     return true;
   }
   if (name == element::kCoordGeom) {
-    countAttributes(context_, name, attributes);
-    geometry_.begin(path);
-    geometryDepth_ = path.depth();
+    geometry_.begin(path, attributes);
     return true;
   }
   return false;
 }
 
 void ParcelsHandler::text(const ElementPath& path, std::wstring_view text) {
-  if (geometryDepth_ > 0) {
+  if (geometry_.isOpen()) {
     geometry_.text(path, text);
   } else if (path.name() == element::kCenter) {
     center_.text(text);
@@ -146,22 +128,8 @@ void ParcelsHandler::text(const ElementPath& path, std::wstring_view text) {
 }
 
 void ParcelsHandler::end(const ElementPath& path) {
-  if (geometryDepth_ > 0) {
-    if (path.depth() > geometryDepth_) {
-      geometry_.end(path);
-      return;
-    }
-    std::vector<Vertex>& boundary = open_.back().boundary;
-    for (const Run& run : geometry_.runs()) {
-      for (const Vertex& vertex : run.vertices) {
-        if (!boundary.empty() && isSamePosition(boundary.back(), vertex)) {
-          boundary.back().bulge = vertex.bulge;  // the joint of two runs
-          continue;
-        }
-        boundary.push_back(vertex);
-      }
-    }
-    geometryDepth_ = 0;
+  if (geometry_.isOpen()) {
+    if (geometry_.end(path)) addBoundary();
     return;
   }
   const std::wstring_view name = path.name();
@@ -169,6 +137,20 @@ void ParcelsHandler::end(const ElementPath& path) {
     endCenter();
   } else if (name == element::kParcel) {
     endParcel();
+  }
+}
+
+// The runs of the CoordGeom join the boundary of the parcel being read.
+void ParcelsHandler::addBoundary() {
+  std::vector<Vertex>& boundary = open_.back().boundary;
+  for (const Run& run : geometry_.runs()) {
+    for (const Vertex& vertex : run.vertices) {
+      if (!boundary.empty() && isSamePosition(boundary.back(), vertex)) {
+        boundary.back().bulge = vertex.bulge;  // the joint of two runs
+        continue;
+      }
+      boundary.push_back(vertex);
+    }
   }
 }
 
@@ -213,11 +195,8 @@ void ParcelsHandler::endParcel() {
                                              vertex.height == kNoValue ? 0.0 : vertex.height, vertex.bulge));
     auto alignment = std::make_unique<DexHorizontalAlignment>();
     alignment->setName(name);
-    DexHorizontalAlignment* const link = alignment.get();
-    if (context_.data().getIEAlignmentPartsDictionary()->addAlignmentPart(alignment.get())) {
-      alignment.release();
-      added->setHAlignment(link);
-    }
+    if (context_.data().getIEAlignmentPartsDictionary()->addAlignmentPart(alignment.get()))
+      added->setHAlignment(alignment.release());  // the dictionary owns it now
     context_.dataset().addRegion(region.release());
   }
   context_.dataset().add(added.release());

@@ -68,7 +68,8 @@ int ReadContext::readCoordinates(std::wstring_view text, double* meters, int cap
 }
 
 bool ReadContext::toMeters(std::vector<double>& values) const {
-  return std::all_of(values.begin(), values.end(), [this](double& value) { return convert(value, units_.linear); });
+  return std::all_of(values.begin(), values.end(),
+                     [this](double& value) { return convert(value, units_.linear); });
 }
 
 void ReadContext::notHeld(std::wstring_view element) {
@@ -86,6 +87,12 @@ void ReadContext::notHeld(std::wstring_view element, std::wstring_view attribute
   key += L'@';
   key += attribute;
   notHeld(key);
+}
+
+void ReadContext::notHeldAttributes(std::wstring_view element, std::wstring_view attributes) {
+  forEachAttribute(attributes, [&](std::wstring_view attribute, std::wstring_view /*value*/) {
+    notHeld(element, attribute);
+  });
 }
 
 void ReadContext::malformed(std::wstring_view kind, std::wstring_view detail) {

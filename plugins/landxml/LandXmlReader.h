@@ -67,6 +67,8 @@ class ReadContext {
   // An attribute the model cannot hold, counted as "element@attribute"; derived attributes are not
   // counted (isDerivedAttribute).
   void notHeld(std::wstring_view element, std::wstring_view attribute);
+  // Every attribute of a serialised list counted as not held.
+  void notHeldAttributes(std::wstring_view element, std::wstring_view attributes);
   // A malformed part: counted by its kind, the first kTracedProblems traced with the detail.
   void malformed(std::wstring_view kind, std::wstring_view detail);
   // The result of the run: DEX_RESULT_OK or the highest remark that applies (see LandXmlWords.h).

@@ -25,9 +25,7 @@ bool SurfacesHandler::start(const ElementPath& path, std::wstring_view attribute
   const std::wstring_view name = path.name();
   const std::wstring_view parent = path.name(1);
   if (name == element::kSurfaces) {
-    forEachAttribute(attributes, [&](std::wstring_view attribute, std::wstring_view /*value*/) {
-      context_.notHeld(name, attribute);
-    });
+    context_.notHeldAttributes(name, attributes);
     return true;
   }
   if (name == element::kSurface && parent == element::kSurfaces) {
@@ -156,7 +154,8 @@ void SurfacesHandler::endBreakline() {
   }
   for (std::size_t i = 0; i < breaklineValues_.size(); i += dimension) {
     DexStation station;
-    station.setPosition(breaklineValues_[i], breaklineValues_[i + 1], dimension == 3 ? breaklineValues_[i + 2] : kNoValue);
+    station.setPosition(breaklineValues_[i], breaklineValues_[i + 1],
+                        dimension == 3 ? breaklineValues_[i + 2] : kNoValue);
     breakline->addStation(station);
   }
   DexBreakline* const added = breakline.get();

@@ -138,10 +138,10 @@ void XmlText::number(double value, int decimals) {
   }
   std::array<char, 64> digits{};
   // Beyond survey magnitudes fixed notation would write hundreds of digits: the shortest exact form.
-  const auto written =
-      std::fabs(value) < kLargestFixed
-          ? std::to_chars(digits.data(), digits.data() + digits.size(), value, std::chars_format::fixed, decimals)
-          : std::to_chars(digits.data(), digits.data() + digits.size(), value);
+  const auto written = std::fabs(value) < kLargestFixed
+                           ? std::to_chars(digits.data(), digits.data() + digits.size(), value,
+                                           std::chars_format::fixed, decimals)
+                           : std::to_chars(digits.data(), digits.data() + digits.size(), value);
   bytes_.append(digits.data(), written.ptr);
 }
 
