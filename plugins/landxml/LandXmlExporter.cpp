@@ -185,24 +185,45 @@ bool LandXmlExporter::writeBlock() {
   return true;
 }
 
+// ---- Names written -------------------------------------------------------------------------------
+
+void WrittenNames::reset(std::size_t expected) {
+  std::size_t capacity = 64;
+  while (capacity < 2 * expected)
+    capacity *= 2;
+  slots_.assign(capacity, Slot{});
+  mask_ = capacity - 1;
+}
+
+bool WrittenNames::insert(std::wstring_view name, const DexDesignPoint* point) {
+  const std::size_t hash = std::hash<std::wstring_view>{}(name);
+  for (std::size_t at = hash & mask_;; at = (at + 1) & mask_) {
+    Slot& slot = slots_[at];
+    if (slot.point == nullptr) {
+      slot = {hash, point};
+      return true;
+    }
+    if (slot.hash == hash && slot.point->getName().view() == name) return false;
+  }
+}
+
 // Writes the next block of the CgPoints being written; true when every point is written. The first
 // CgPoints takes the dataset's points, each further one the points whose names the one before had.
 bool LandXmlExporter::writePoints() {
+  const bool fromDataset = pass_ == 0;
+  const int count = fromDataset ? objectCount_ : static_cast<int>(pointsLeft_.size());
   if (!collectionOpen_) {
     writer_->startCollection("CgPoints");
     collectionOpen_ = true;
-    names_.clear();
+    names_.reset(static_cast<std::size_t>(count));
   }
-  const bool fromDataset = pointsLeft_.empty();
-  const int count = fromDataset ? objectCount_ : static_cast<int>(pointsLeft_.size());
   const int end = std::min(count, next_ + kObjectsPerStep);
   for (; next_ < end; ++next_) {
     const DexDesignPoint* point = fromDataset
                                       ? dynamic_cast<const DexDesignPoint*>(dataset_->getObjectAt(next_))
                                       : pointsLeft_[static_cast<std::size_t>(next_)];
     if (point == nullptr) continue;
-    const std::wstring_view name = point->getName().view();
-    if (!name.empty() && !names_.insert(name).second) {
+    if (!point->getName().IsEmpty() && !names_.insert(point->getName().view(), point)) {
       pointsLater_.push_back(point);
       continue;
     }
@@ -214,7 +235,7 @@ bool LandXmlExporter::writePoints() {
   pointsLeft_ = std::move(pointsLater_);
   pointsLater_.clear();
   next_ = 0;
-  names_.clear();
+  ++pass_;
   return pointsLeft_.empty();
 }
 

@@ -5,6 +5,7 @@
 #include <memory>
 #include <string_view>
 #include <unordered_set>
+#include <utility>
 #include <vector>
 
 #include "LandXmlText.h"
@@ -21,6 +22,25 @@ class DexObject;
 namespace vyn::ie::landxml {
 
 class LandXmlWriter;
+
+// The names written in one CgPoints (names are unique in one): an open-addressing table of name
+// hashes and points, one probe a name in the common case, so that a million names cost one cache
+// miss each rather than the three of a node-based set.
+class WrittenNames {
+ public:
+  // Empties the table for about expected names.
+  void reset(std::size_t expected);
+  // True, and name is entered, when no point of that name was entered before.
+  bool insert(std::wstring_view name, const DexDesignPoint* point);
+
+ private:
+  struct Slot {
+    std::size_t hash = 0;
+    const DexDesignPoint* point = nullptr;  // null: free
+  };
+  std::vector<Slot> slots_;
+  std::size_t mask_ = 0;
+};
 
 // Writes the container's current dataset as one LandXML 1.2 document, UTF-8: the LandXML root with
 // Units (the settings' units when LandXML can name them, else meters and decimal degrees) and
@@ -81,10 +101,11 @@ class LandXmlExporter final : public DexExporterImpl {
   int nextPart_ = 0;  // the next position or triangle of the surface being written
   bool collectionOpen_ = false;
   int objectCount_ = 0;
-  // Points whose name was written in the CgPoints being written: they go into the next one.
+  // The points whose name was written in the CgPoints being written go into the next one.
+  int pass_ = 0;  // the CgPoints being written: 0 takes the dataset's points, others pointsLeft_
   std::vector<const DexDesignPoint*> pointsLeft_;
   std::vector<const DexDesignPoint*> pointsLater_;
-  std::unordered_set<std::wstring_view> names_;        // the names written in the CgPoints being written
+  WrittenNames names_;
   std::unordered_set<const DexObject*> surfaceLines_;  // breaklines written with their surfaces
   std::int64_t notWritten_ = 0;
 };

@@ -41,8 +41,8 @@ class UnitsHandler final : public CollectionHandler {
 // and code the point's codes (codes separated by blanks, each as CODE[:STRING...][;ATTRIBUTE=VALUE...]
 // like the point files; a code text that is not of that form is one code). A text that is not 2 or 3
 // numbers, or a pntRef to no point read before, skips the point (malformed); a point with neither
-// text nor pntRef has no coordinates. With lists wanted, a named CgPoints group becomes an object list of its points,
-// and a CgPoint without name and text that only names a point with pntRef adds that point to it.
+// text nor pntRef has no coordinates. With lists wanted, a named CgPoints group becomes an object list of its
+// points, and a CgPoint without name and text that only names a point with pntRef adds that point to it.
 class CgPointsHandler final : public CollectionHandler {
  public:
   CgPointsHandler(ReadContext& context, bool withLists);
