@@ -60,6 +60,7 @@ class CgPointsHandler final : public CollectionHandler {
   ReadContext& context_;
   const bool withLists_;
   point_files::CodeReader codes_;
+  std::wstring rejectedCodes_;
   std::vector<DexObjectList*> groups_;  // the open CgPoints, null for one without a list
   std::wstring name_;
   std::wstring code_;

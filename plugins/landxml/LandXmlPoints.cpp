@@ -190,7 +190,8 @@ void CgPointsHandler::endPoint() {
 }
 
 void CgPointsHandler::addCodes(DexDesignPoint& point) {
-  if (codes_.read(code_, point)) return;
+  rejectedCodes_.clear();
+  if (codes_.read(code_, point, rejectedCodes_)) return;
   // Not a code text of the point files' form: the whole text is one code.
   point.removeAllCodes();
   CVynStringT<wchar_t>& name = context_.scratch();
