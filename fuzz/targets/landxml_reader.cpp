@@ -14,8 +14,10 @@
 
 #include "hostlibs/VynLogging.h"
 #include "ieDefinitions/IEFormatsData.h"
+#include "ieObjects/IEAlignment.h"
 #include "ieObjects/IEData.h"
 #include "ieObjects/IEDataset.h"
+#include "ieObjects/IEHorizontalAlignment.h"
 #include "ieObjects/IEParcel.h"
 #include "ieObjects/IEPoints.h"
 #include "ieObjects/IEPolyLines.h"
@@ -71,7 +73,7 @@ EDexResult run(DexData& data, const dex_fuzz::ScratchFile& file, bool import) {
 }
 
 struct Totals {
-  int points = 0, surfaces = 0, triangles = 0, parcels = 0;
+  int points = 0, surfaces = 0, triangles = 0, parcels = 0, alignments = 0, elements = 0;
 };
 
 // Checks what an import gave and answers its totals.
@@ -110,6 +112,15 @@ Totals checkModel(DexData& data) {
   for (int p = 0; p < totals.parcels; ++p) {
     const DexDesignPoint* centre = dataset.getParcelAt(p)->getCentralPoint();
     DEX_FUZZ_CHECK(centre == nullptr || objects.count(centre) == 1);
+  }
+  totals.alignments = dataset.getNumberOfAlignments();
+  for (int a = 0; a < totals.alignments; ++a) {
+    const auto* plan = dynamic_cast<const DexHorizontalAlignment*>(
+        dataset.getAlignmentAt(a)->getAlignmentPart(IDexAlignmentPart::HORIZONTAL_ALIGNMENT));
+    if (plan == nullptr) continue;
+    for (int e = 0; e < plan->getNumberOfSegments(); ++e)
+      DEX_FUZZ_CHECK(plan->getSegmentAt(e) != nullptr);
+    totals.elements += plan->getNumberOfSegments();
   }
   return totals;
 }
@@ -151,5 +162,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
   DEX_FUZZ_CHECK(reread.surfaces == read.surfaces);
   DEX_FUZZ_CHECK(reread.triangles == read.triangles);
   DEX_FUZZ_CHECK(reread.parcels == read.parcels);
+  DEX_FUZZ_CHECK(reread.alignments == read.alignments);
+  DEX_FUZZ_CHECK(reread.elements == read.elements);
   return 0;
 }

@@ -29,6 +29,11 @@ bool wantsPoints(const DexSettings& settings) {
   return settings.hasDataType(POINTS) || settings.hasDataType(POINT_LISTS);
 }
 
+bool wantsAlignments(const DexSettings& settings) {
+  return settings.hasDataType(ROADS) || settings.hasDataType(H_ALIGNMENTS) ||
+         settings.hasDataType(V_ALIGNMENTS);
+}
+
 // The breaklines a written surface holds (they are written with it, not as plan features).
 std::unordered_set<const DexObject*> surfaceBreaklines(const DexDataset& dataset) {
   std::unordered_set<const DexObject*> held;
@@ -150,6 +155,8 @@ void LandXmlExporter::nextStage() {
         return settings.hasDataType(SURFACES);
       case Stage::PARCELS:
         return settings.hasDataType(PARCELS);
+      case Stage::ALIGNMENTS:
+        return wantsAlignments(settings);
       case Stage::CLOSE:
         return true;
     }
@@ -177,6 +184,9 @@ bool LandXmlExporter::writeBlock() {
       break;
     case Stage::PARCELS:
       stageDone = writeParcels();
+      break;
+    case Stage::ALIGNMENTS:
+      stageDone = writeAlignments();
       break;
     case Stage::CLOSE:
       return true;
@@ -341,6 +351,19 @@ bool LandXmlExporter::flush() {
     writeFailed_ = std::fwrite(text_.bytes().data(), 1, text_.size(), file_) != text_.size();
   text_.clear();
   return !writeFailed_;
+}
+
+// One alignment a step; Alignments is opened at the first (it holds one at least).
+bool LandXmlExporter::writeAlignments() {
+  const int count = dataset_->getNumberOfAlignments();
+  if (next_ < count) {
+    if (!collectionOpen_) writer_->startCollection("Alignments");
+    collectionOpen_ = true;
+    notWritten_ += writer_->alignment(*dataset_->getAlignmentAt(next_++));
+  }
+  if (next_ < count) return false;
+  if (collectionOpen_) writer_->endCollection("Alignments");
+  return true;
 }
 
 }  // namespace vyn::ie::landxml

@@ -52,11 +52,13 @@ class WrittenNames {
 //    holds (a closed polyline ends where it starts; see LandXmlWriter for Chains);
 //  - SURFACES: Surfaces, each with its breaklines and, with three positions and a triangle at least,
 //    its TIN Definition;
-//  - PARCELS: Parcels with their central points and boundaries (the region of the parcel's name).
+//  - PARCELS: Parcels with their central points and boundaries (the region of the parcel's name);
+//  - ROADS, H_ALIGNMENTS, V_ALIGNMENTS or STA_EQUATION_SETS: Alignments with the dataset's alignments (see
+//    LandXmlWriter::alignment).
 // Coordinates are written in the settings' decimals. Objects the document cannot carry (arcs,
 // circles, text labels, sheet points, linework of fewer than two plan positions, triangles with a
-// corner outside the positions) are counted, traced and not written; the export then answers
-// kResultNotHeld.
+// corner outside the positions, intersection points of horizontal alignments) are counted, traced and not
+// written; the export then answers kResultNotHeld.
 //
 // Steps: opening the file (after the overwrite question; the file is recorded as exported as soon as
 // it exists) and writing the header, one step per block of objects, closing it. Results:
@@ -78,7 +80,7 @@ class LandXmlExporter final : public DexExporterImpl {
   bool singleStep() override;
 
  private:
-  enum class Stage { POINTS, POINT_LISTS, LINES, SURFACES, PARCELS, CLOSE };
+  enum class Stage { POINTS, POINT_LISTS, LINES, SURFACES, PARCELS, ALIGNMENTS, CLOSE };
 
   bool open();
   bool writeBlock();
@@ -87,6 +89,7 @@ class LandXmlExporter final : public DexExporterImpl {
   bool writeLines();
   bool writeSurfaces();
   bool writeParcels();
+  bool writeAlignments();
   bool close();
   bool flush();
   void nextStage();

@@ -154,15 +154,45 @@ class ParcelsHandler final : public CollectionHandler {
   std::vector<Parcel> open_;  // the parcels being read, innermost last
 };
 
-// The road collections (Alignments with their Profile, CrossSects and StaEquation) that the model's
-// road classes will hold: until then each of those elements is counted as not held.
-class RoadsCounter final : public CollectionHandler {
+// Alignments: one alignment of the dataset per Alignment (name, staStart, length), with
+//  - its CoordGeom as a horizontal alignment of the same name in the parts dictionary: a Line becomes
+//    a DexLine2D, a Curve a DexCurve, a Spiral a DexSpiral (spiType, rot, radiusStart and radiusEnd,
+//    "INF" held as 0, the radius of a straight end; constant), lengths in meters and azimuths in
+//    decimal degrees clockwise from north: dir, dirStart and dirEnd where given (in the file's
+//    direction unit), else from the element's points (a Curve from its centre, a Spiral from its
+//    tangents through PI). A Curve without Center takes the minor arc of its radius; a
+//    Curve of zero radius becomes the Line of its chord, a malformed part;
+//  - its StaEquations as a station-equation set named after the alignment (staInternal the running
+//    chainage), validated; a set the dictionary refuses is a malformed part;
+//  - each ProfAlign of its Profiles as a vertical alignment named after the ProfAlign, holding both a
+//    vertical element and a long section per PVI, ParaCurve, UnsymParaCurve and CircCurve (see
+//    README: grades in percent, stations and levels in meters).
+// CrossSects, ProfSurf, Superelevation, AlignPIs and the rest are counted as not held.
+class AlignmentsHandler final : public CollectionHandler {
  public:
-  explicit RoadsCounter(ReadContext& context) : context_(context) {}
+  explicit AlignmentsHandler(ReadContext& context);
+  ~AlignmentsHandler() override;
   bool start(const ElementPath& path, std::wstring_view attributes) override;
+  void text(const ElementPath& path, std::wstring_view text) override;
+  void end(const ElementPath& path) override;
+  void finish() override;
 
  private:
+  struct Road;
+  bool startInAlignment(const ElementPath& path, std::wstring_view attributes);
+  void startAlignment(std::wstring_view attributes);
+  void endAlignment();
+  void startGeometry(std::wstring_view name, std::wstring_view attributes);
+  void endGeometry();
+  void addStaEquation(std::wstring_view attributes);
+  void startProfile(std::wstring_view attributes);
+  void startProfAlign(std::wstring_view attributes);
+  void startVertex(std::wstring_view name, std::wstring_view attributes);
+  void endVertex();
+  void endProfAlign();
+
   ReadContext& context_;
+  std::unique_ptr<Road> road_;  // the Alignment being read, null outside one
 };
 
 }  // namespace vyn::ie::landxml

@@ -54,7 +54,7 @@ EDexResult LandXmlImporter::doImport() {
   PlanFeaturesHandler features(context);
   SurfacesHandler surfaces(context);
   ParcelsHandler parcels(context);
-  RoadsCounter roads(context);
+  AlignmentsHandler roads(context);
 
   LandXmlReader reader(context);
   reader.addCollection(element::kUnits, units);

@@ -1,4 +1,4 @@
-// The PlanFeatures and Parcels handlers, and the counter of the road collections.
+// The PlanFeatures and Parcels handlers.
 
 #include <memory>
 
@@ -200,16 +200,6 @@ void ParcelsHandler::endParcel() {
     context_.dataset().addRegion(region.release());
   }
   context_.dataset().add(added.release());
-}
-
-// ---- Roads ---------------------------------------------------------------------------------------
-
-bool RoadsCounter::start(const ElementPath& path, std::wstring_view /*attributes*/) {
-  const std::wstring_view name = path.name();
-  if (name == element::kAlignment || name == element::kProfile || name == element::kCrossSects ||
-      name == element::kStaEquation)
-    context_.notHeld(name);
-  return true;
 }
 
 }  // namespace vyn::ie::landxml

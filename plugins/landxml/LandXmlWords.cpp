@@ -50,9 +50,10 @@ constexpr std::array<BreaklineWord, 4> kBreaklineWords{{
     {L"nondestructive", 4},
 }};
 
-constexpr std::array<std::wstring_view, 16> kDerivedAttributes{
-    L"length",   L"dir",    L"radius",  L"chord", L"delta",   L"dirStart", L"dirEnd",     L"tangent",
-    L"external", L"midOrd", L"crvType", L"area",  L"elevMax", L"elevMin",  L"area2DSurf", L"area3DSurf"};
+constexpr std::array<std::wstring_view, 23> kDerivedAttributes{
+    L"length",   L"dir",    L"radius",  L"chord",   L"delta",    L"dirStart", L"dirEnd",      L"tangent",
+    L"external", L"midOrd", L"crvType", L"area",    L"elevMax",  L"elevMin",  L"area2DSurf",  L"area3DSurf",
+    L"theta",    L"totalX", L"totalY",  L"tanLong", L"tanShort", L"staStart", L"staIncrement"};
 
 constexpr unsigned stateMask() {
   unsigned mask = 0;

@@ -64,12 +64,17 @@ inline constexpr std::wstring_view kFaces = L"Faces";
 inline constexpr std::wstring_view kF = L"F";
 inline constexpr std::wstring_view kParcels = L"Parcels";
 inline constexpr std::wstring_view kParcel = L"Parcel";
-// Road collections, held by the road handlers.
+// Road collections.
 inline constexpr std::wstring_view kAlignments = L"Alignments";
 inline constexpr std::wstring_view kAlignment = L"Alignment";
 inline constexpr std::wstring_view kProfile = L"Profile";
 inline constexpr std::wstring_view kCrossSects = L"CrossSects";
 inline constexpr std::wstring_view kStaEquation = L"StaEquation";
+inline constexpr std::wstring_view kProfAlign = L"ProfAlign";
+inline constexpr std::wstring_view kPvi = L"PVI";
+inline constexpr std::wstring_view kParaCurve = L"ParaCurve";
+inline constexpr std::wstring_view kUnsymParaCurve = L"UnsymParaCurve";
+inline constexpr std::wstring_view kCircCurve = L"CircCurve";
 }  // namespace element
 
 // ---- Attributes ------------------------------------------------------------------------------
@@ -99,6 +104,19 @@ inline constexpr std::wstring_view kLength = L"length";
 inline constexpr std::wstring_view kId = L"id";
 inline constexpr std::wstring_view kSurfType = L"surfType";
 inline constexpr std::wstring_view kBrkType = L"brkType";
+inline constexpr std::wstring_view kStaStart = L"staStart";
+inline constexpr std::wstring_view kDir = L"dir";
+inline constexpr std::wstring_view kDirStart = L"dirStart";
+inline constexpr std::wstring_view kDirEnd = L"dirEnd";
+inline constexpr std::wstring_view kRadiusStart = L"radiusStart";
+inline constexpr std::wstring_view kRadiusEnd = L"radiusEnd";
+inline constexpr std::wstring_view kSpiType = L"spiType";
+inline constexpr std::wstring_view kConstant = L"constant";
+inline constexpr std::wstring_view kStaInternal = L"staInternal";
+inline constexpr std::wstring_view kStaBack = L"staBack";
+inline constexpr std::wstring_view kStaAhead = L"staAhead";
+inline constexpr std::wstring_view kLengthIn = L"lengthIn";
+inline constexpr std::wstring_view kLengthOut = L"lengthOut";
 }  // namespace attribute
 
 // Attributes that are derived from the geometry the plug-in reads (lengths, directions, angles and
@@ -113,6 +131,8 @@ bool isFramingAttribute(std::wstring_view name);
 inline constexpr std::wstring_view kClockwise = L"cw";
 inline constexpr std::wstring_view kCounterClockwise = L"ccw";
 inline constexpr std::wstring_view kTin = L"TIN";
+// The radius of a spiral's straight end (an xs:double infinity).
+inline constexpr std::wstring_view kInfinite = L"INF";
 inline constexpr std::wstring_view kWrittenVersion = L"1.2";
 inline constexpr std::wstring_view kNamespace = L"http://www.landxml.org/schema/LandXML-1.2";
 inline constexpr std::wstring_view kSchemaInstance = L"http://www.w3.org/2001/XMLSchema-instance";

@@ -3,12 +3,15 @@
 #include <algorithm>
 #include <cmath>
 
+#include "ieObjects/IEAlignment.h"
 #include "ieObjects/IEHorizontalAlignment.h"
 #include "ieObjects/IEParcel.h"
 #include "ieObjects/IEPoints.h"
 #include "ieObjects/IEPolyLines.h"
 #include "ieObjects/IERegion.h"
+#include "ieObjects/IEStationEquations.h"
 #include "ieObjects/IESurface.h"
+#include "ieObjects/IEVerticalAlignment.h"
 #include "ieUtils/IESettings.h"
 #include "pointfiles/CodeText.h"
 
@@ -20,6 +23,8 @@ namespace {
 constexpr double kStraightBulge = 1e-12;
 // Decimals of the radius and length of a curve beyond those of the coordinates.
 constexpr int kExtraCurveDecimals = 3;
+// Decimals of directions: a ten-thousandth of a second of arc in decimal degrees.
+constexpr int kDirectionDecimals = 8;
 
 std::string ascii(std::wstring_view word) {
   return std::string(word.begin(), word.end());
@@ -381,6 +386,215 @@ void LandXmlWriter::parcel(const DexParcel& parcel, const DexRegion* boundary, b
   }
   out_.newLine(2);
   out_.end("Parcel");
+}
+
+// ---- Alignments ----------------------------------------------------------------------------------
+
+int LandXmlWriter::alignment(const DexAlignment& alignment) {
+  const int lengthDecimals = decimals_[0] + kExtraCurveDecimals;
+  out_.newLine(2);
+  out_.start("Alignment");
+  out_.attribute("name", alignment.getName().view());
+  out_.attribute("length", distance(alignment.getLength()), lengthDecimals);
+  out_.attribute("staStart", distance(alignment.getStaStart()), lengthDecimals);
+  out_.endStart();
+  int leftOut = 0;
+  const auto* horizontal = dynamic_cast<const DexHorizontalAlignment*>(
+      alignment.getAlignmentPart(IDexAlignmentPart::HORIZONTAL_ALIGNMENT));
+  out_.newLine(3);
+  out_.start("CoordGeom");
+  out_.endStart();
+  for (int i = 0; horizontal != nullptr && i < horizontal->getNumberOfSegments(); ++i) {
+    const IDexAlignmentObjInterface* element = horizontal->getSegmentAt(i);
+    if (const auto* asLine = dynamic_cast<const DexLine2D*>(element)) {
+      line(*asLine);
+    } else if (const auto* asCurve = dynamic_cast<const DexCurve*>(element)) {
+      curve(*asCurve);
+    } else if (const auto* asSpiral = dynamic_cast<const DexSpiral*>(element)) {
+      spiral(*asSpiral);
+    } else {
+      ++leftOut;
+    }
+  }
+  out_.newLine(3);
+  out_.end("CoordGeom");
+  const DexStaEquationSet* equations = alignment.getStaEquationSet();
+  if (equations == nullptr && horizontal != nullptr) equations = horizontal->getStaEquationSet();
+  if (equations != nullptr) staEquations(*equations);
+  bool profileOpen = false;
+  for (int i = 0; i < alignment.getNumberOfAlignmentParts(); ++i) {
+    const auto* vertical = dynamic_cast<const DexVerticalAlignment*>(alignment.getAlignmentPartAt(i));
+    if (vertical == nullptr) continue;
+    if (!profileOpen) {
+      out_.newLine(3);
+      out_.start("Profile");
+      out_.attribute("name", alignment.getName().view());
+      out_.endStart();
+      profileOpen = true;
+    }
+    profile(*vertical);
+  }
+  if (profileOpen) {
+    out_.newLine(3);
+    out_.end("Profile");
+  }
+  out_.newLine(2);
+  out_.end("Alignment");
+  return leftOut;
+}
+
+void LandXmlWriter::direction(std::string_view name, double azimuth) {
+  out_.attribute(name, utils::decDegToAngle(angleUnits_, azimuth, kDirectionDecimals), kDirectionDecimals);
+}
+
+void LandXmlWriter::planPoint(std::string_view element, const DexPosition2D& position) {
+  pointElement(element, Node{position.getX(), position.getY(), kNoValue, 0.0});
+}
+
+void LandXmlWriter::line(const DexLine2D& line) {
+  out_.newLine(4);
+  out_.start("Line");
+  if (line.isStartAzimuthDefined()) direction("dir", line.getData(DexLine2D::START_AZIMUTH));
+  out_.attribute("length", distance(line.getData(DexLine2D::LENGTH)), decimals_[0] + kExtraCurveDecimals);
+  out_.endStart();
+  planPoint("Start", line.getPosition(DexLine2D::START_POINT));
+  planPoint("End", line.getPosition(DexLine2D::END_POINT));
+  out_.newLine(4);
+  out_.end("Line");
+}
+
+void LandXmlWriter::curve(const DexCurve& curve) {
+  const int lengthDecimals = decimals_[0] + kExtraCurveDecimals;
+  out_.newLine(4);
+  out_.start("Curve");
+  out_.attribute("rot", ascii(curve.isTurnClockwised() ? kClockwise : kCounterClockwise));
+  out_.attribute("radius", distance(curve.getData(DexCurve::RADIUS)), lengthDecimals);
+  out_.attribute("length", distance(curve.getData(DexCurve::LENGTH)), lengthDecimals);
+  if (curve.hasData(DexCurve::START_AZIMUTH)) direction("dirStart", curve.getData(DexCurve::START_AZIMUTH));
+  if (curve.hasData(DexCurve::END_AZIMUTH)) direction("dirEnd", curve.getData(DexCurve::END_AZIMUTH));
+  out_.endStart();
+  planPoint("Start", curve.getPosition(DexCurve::START_POINT));
+  planPoint("Center", curve.getPosition(DexCurve::CENTER_POINT));
+  planPoint("End", curve.getPosition(DexCurve::END_POINT));
+  const DexPosition2D& pi = curve.getPosition(DexCurve::PI_POINT);
+  if (pi.getX() != 0.0 || pi.getY() != 0.0) planPoint("PI", pi);
+  out_.newLine(4);
+  out_.end("Curve");
+}
+
+void LandXmlWriter::spiral(const DexSpiral& spiral) {
+  const int lengthDecimals = decimals_[0] + kExtraCurveDecimals;
+  const auto radius = [&](std::string_view name, double meters) {
+    if (meters == 0.0) {
+      out_.attribute(name, ascii(kInfinite));  // a straight end
+    } else {
+      out_.attribute(name, distance(meters), lengthDecimals);
+    }
+  };
+  out_.newLine(4);
+  out_.start("Spiral");
+  out_.attribute("length", distance(spiral.getData(DexSpiral::LENGTH)), lengthDecimals);
+  radius("radiusStart", spiral.getData(DexSpiral::START_RADIUS));
+  radius("radiusEnd", spiral.getData(DexSpiral::END_RADIUS));
+  out_.attribute("rot", ascii(spiral.isTurnClockwised() ? kClockwise : kCounterClockwise));
+  out_.attribute("spiType", spiral.getSpiralTypeAsString().view());
+  const double constant = spiral.getData(DexSpiral::SPIRAL_CONSTANT);
+  if (constant != 0.0) out_.attribute("constant", distance(constant), lengthDecimals);
+  direction("dirStart", spiral.getData(DexSpiral::START_AZIMUTH));
+  direction("dirEnd", spiral.getData(DexSpiral::END_AZIMUTH));
+  out_.endStart();
+  planPoint("Start", spiral.getPosition(DexSpiral::START_POINT));
+  planPoint("PI", spiral.getPosition(DexSpiral::PI_POINT));
+  planPoint("End", spiral.getPosition(DexSpiral::END_POINT));
+  out_.newLine(4);
+  out_.end("Spiral");
+}
+
+void LandXmlWriter::staEquations(const DexStaEquationSet& set) {
+  const int decimals = decimals_[0] + kExtraCurveDecimals;
+  for (int i = 0; i < set.getNumberOfEquations(); ++i) {
+    const DexStaEquation& equation = *set.getEquationAt(i);
+    out_.newLine(3);
+    out_.start("StaEquation");
+    out_.attribute("staAhead", distance(equation.getData(DexStaEquation::STATION_AHEAD)), decimals);
+    if (equation.isDataSet(DexStaEquation::STATION_BACK))
+      out_.attribute("staBack", distance(equation.getData(DexStaEquation::STATION_BACK)), decimals);
+    out_.attribute("staInternal", distance(equation.getData(DexStaEquation::RUNNING_CHAINAGE)), decimals);
+    if (!equation.getName().IsEmpty()) out_.attribute("desc", equation.getName().view());
+    out_.endEmpty();
+  }
+}
+
+// The vertices of a profile, from its vertical elements or, when it has none, its long sections.
+void LandXmlWriter::profile(const DexVerticalAlignment& profile) {
+  const int lengthDecimals = decimals_[0] + kExtraCurveDecimals;
+  out_.newLine(4);
+  out_.start("ProfAlign");
+  out_.attribute("name", profile.getName().view());
+  out_.endStart();
+  const auto vertex = [&](std::string_view element, double station, double level, double length,
+                          double radius) {
+    out_.newLine(5);
+    out_.start(element);
+    if (element == "ParaCurve" || element == "CircCurve")
+      out_.attribute("length", distance(length), lengthDecimals);
+    if (element == "CircCurve") out_.attribute("radius", distance(radius), lengthDecimals);
+    profileVertex(element, station, level);
+  };
+  for (int i = 0; i < profile.getNumberOfVerticalElements(); ++i) {
+    const DexVerticalElement& element = *profile.getVerticalElementAt(i);
+    const double station = element.getData(DexVerticalElement::VERTEX_STATION);
+    const double level = element.getData(DexVerticalElement::VERTEX_LEVEL);
+    switch (element.getElementType()) {
+      case DexVerticalElement::VERTEX:
+        vertex("PVI", station, level, 0.0, 0.0);
+        break;
+      case DexVerticalElement::PARABOLA:
+        vertex("ParaCurve", station, level, element.getData(DexVerticalElement::CURVE_LENGTH), 0.0);
+        break;
+      case DexVerticalElement::ASYMMETRIC_PARABOLA:
+        out_.newLine(5);
+        out_.start("UnsymParaCurve");
+        out_.attribute("lengthIn", distance(element.getData(DexVerticalElement::LENGTH_IN)), lengthDecimals);
+        out_.attribute("lengthOut", distance(element.getData(DexVerticalElement::LENGTH_OUT)),
+                       lengthDecimals);
+        profileVertex("UnsymParaCurve", station, level);
+        break;
+      case DexVerticalElement::CIRCULAR_CURVE:
+        vertex("CircCurve", station, level, element.getData(DexVerticalElement::CURVE_LENGTH),
+               element.getData(DexVerticalElement::RADIUS));
+        break;
+    }
+  }
+  for (int i = 0; profile.getNumberOfVerticalElements() == 0 && i < profile.getNumberOfLongSections(); ++i) {
+    const DexLongSection* section = profile.getLongSectionAt(i);
+    if (section == nullptr) continue;
+    const double station = section->getData(DexLongSection::STATION);
+    const double level = section->getData(DexLongSection::LEVEL);
+    const double length = section->getData(DexLongSection::CURVE_LENGTH);
+    switch (section->getLSType()) {
+      case DexLongSection::LEVEL_POINT:
+        vertex("PVI", station, level, 0.0, 0.0);
+        break;
+      case DexLongSection::PARABOLA_POINT:
+        vertex("ParaCurve", station, level, length, 0.0);
+        break;
+      case DexLongSection::CIRCULAR_POINT:
+        vertex("CircCurve", station, level, length, section->getData(DexLongSection::RADIUS));
+        break;
+    }
+  }
+  out_.newLine(4);
+  out_.end("ProfAlign");
+}
+
+// Ends the start tag of a profile vertex begun by the caller, with its "station level" text.
+void LandXmlWriter::profileVertex(std::string_view element, double station, double level) {
+  out_.endStart();
+  out_.number(distance(station), decimals_[0]);
+  out_.blank();
+  out_.number(distance(level), decimals_[2]);
+  out_.end(element);
 }
 
 }  // namespace vyn::ie::landxml

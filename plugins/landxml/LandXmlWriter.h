@@ -12,7 +12,14 @@
 // units and decimals of the settings. Coordinates are written "northing easting [elevation]"; arcs of
 // linework (bulges, see LandXmlGeometry.h) become Curves with their centre.
 namespace vyn::ie {
+class DexAlignment;
+class DexCurve;
 class DexDesignPoint;
+class DexLine2D;
+class DexPosition2D;
+class DexSpiral;
+class DexStaEquationSet;
+class DexVerticalAlignment;
 class DexParcel;
 class DexPolyLine;
 class DexRegion;
@@ -70,6 +77,15 @@ class LandXmlWriter {
   // (may be null) as a closed CoordGeom.
   void parcel(const DexParcel& parcel, const DexRegion* boundary, bool pointsWritten);
 
+  // ---- Alignments ----------------------------------------------------------------------------------
+  // An Alignment: name, length and staStart; the elements of its horizontal alignment as a CoordGeom
+  // of Lines, Curves and Spirals (a spiral's radius 0 written "INF"); the equations of its
+  // station-equation set (or its horizontal alignment's) as StaEquations; its vertical alignments as
+  // the ProfAligns of one Profile, from their vertical elements or, without any, their long sections.
+  // Answers how many elements were left out (intersection points, which LandXML keeps apart from the
+  // geometry).
+  int alignment(const DexAlignment& alignment);
+
  private:
   struct Node {
     double north;
@@ -83,6 +99,15 @@ class LandXmlWriter {
   void coordGeom(const std::vector<Node>& nodes, bool closed);
   void segment(const Node& start, const Node& end);
   double distance(double meters) const;
+  // An azimuth (decimal degrees clockwise from north) in the document's direction unit.
+  void direction(std::string_view name, double azimuth);
+  void planPoint(std::string_view element, const DexPosition2D& position);
+  void line(const DexLine2D& line);
+  void curve(const DexCurve& curve);
+  void spiral(const DexSpiral& spiral);
+  void staEquations(const DexStaEquationSet& set);
+  void profile(const DexVerticalAlignment& profile);
+  void profileVertex(std::string_view element, double station, double level);
 
   XmlText& out_;
   EDistUnits units_ = METERS;

@@ -87,7 +87,8 @@ void fillModel(DexData& data) {
 
   auto* surface = new DexSurface();
   surface->setName(L"EG");
-  for (const auto& [x, y, z] : {std::tuple{0.0, 0.0, 1.0}, {0.0, 10.0, 2.0}, {10.0, 10.0, 3.0}, {10.0, 0.0, 2.5}})
+  for (const auto& [x, y, z] :
+       {std::tuple{0.0, 0.0, 1.0}, {0.0, 10.0, 2.0}, {10.0, 10.0, 3.0}, {10.0, 0.0, 2.5}})
     surface->addPosition(DexPosition3D(x, y, z));
   for (const auto& corners : {std::array{0, 1, 2}, std::array{0, 2, 3}}) {
     auto* triangle = new DexTriangle();
@@ -196,7 +197,8 @@ void expectSameContent(const DexDataset& first, const DexDataset& second, double
     const DexParcel& x = *first.getParcelAt(p);
     const DexParcel& y = *second.getParcelAt(p);
     EXPECT_EQ(x.getName(), y.getName());
-    expectSameStation(x.getCentralPoint()->getStation(), y.getCentralPoint()->getStation(), tolerance, "centre");
+    expectSameStation(x.getCentralPoint()->getStation(), y.getCentralPoint()->getStation(), tolerance,
+                      "centre");
     const DexRegion& u = *first.getRegionAt(p);
     const DexRegion& v = *second.getRegionAt(p);
     ASSERT_EQ(u.getVerticesCount(), v.getVerticesCount());
@@ -251,7 +253,10 @@ TEST_F(LandXmlExport, CoordinatesAreWrittenInTheSettingsUnitsAndDecimals) {
     const char* point;  // of the point K1 of the model, N E Z
   };
   const Case cases[] = {
-      {METERS, {3, 3, 3}, "<Metric areaUnit=\"squareMeter\" linearUnit=\"meter\"", ">5000.123 2000.568 101.250<"},
+      {METERS,
+       {3, 3, 3},
+       "<Metric areaUnit=\"squareMeter\" linearUnit=\"meter\"",
+       ">5000.123 2000.568 101.250<"},
       {IFEET, {2, 2, 1}, "<Imperial areaUnit=\"squareFoot\" linearUnit=\"foot\"", ">16404.60 6563.54 332.2<"},
       {USFEET, {1, 1, 0}, "linearUnit=\"USSurveyFoot\"", ">16404.6 6563.5 332<"},
       {MILLIMETERS, {0, 0, 0}, "linearUnit=\"millimeter\"", ">5000123 2000568 101250<"},
@@ -304,7 +309,8 @@ TEST_F(LandXmlExport, PointsOfOneNameGoIntoCgPointsOfTheirOwnAndAreasIntoClosedF
   const LandXmlRun read = importFile(file);
   EXPECT_EQ((Counts{3, 1}), countsOf(read.dataset()));
   for (int i = 0; i < 3; ++i)
-    EXPECT_EQ(i + 1.0, dynamic_cast<const DexDesignPoint*>(read.dataset().getObjectAt(i))->getStation().getX());
+    EXPECT_EQ(i + 1.0,
+              dynamic_cast<const DexDesignPoint*>(read.dataset().getObjectAt(i))->getStation().getX());
   EXPECT_TRUE(dynamic_cast<const DexPolyLine*>(read.dataset().getObjectAt(3))->isClosed());
 }
 

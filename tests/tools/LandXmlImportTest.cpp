@@ -68,10 +68,10 @@ TEST_F(LandXmlImport, FilesOfOtherProgramsImportWithTheCountsTheyHold) {
   };
   const Case cases[] = {
       // 639 CgPoints and a centre point for each of the 83 parcels; 2 TINs of 713 + 2716 points and
-      // 1284 + 5241 faces; the alignments, their profiles and the pipe network are counted.
-      {"crews_subdivision.xml", kNotHeld, {722, 0, 2, 3429, 6525, 0, 83, 83, 0}, L"not held: 6 Profile"},
+      // 1284 + 5241 faces; the surface profiles of the alignments and the pipe network are counted.
+      {"crews_subdivision.xml", kNotHeld, {722, 0, 2, 3429, 6525, 0, 83, 83, 0}, L"not held: 6 ProfSurf"},
       {"crews_polyline.xml", kNotHeld, {0, 1, 0, 0, 0, 0, 0, 0, 0}, L"not held: 1 Project"},
-      {"mac999_landxml_road_cl_sample.xml", kNotHeld, {}, L"not held: 1 Alignment"},
+      {"mac999_landxml_road_cl_sample.xml", kNotHeld, {}, L"not held: 1 Alignment@desc"},
   };
   for (const Case& c : cases) {
     const dex_test::LogCapture log;
