@@ -135,7 +135,7 @@ void CoordGeomReader::startElement(std::wstring_view name, std::wstring_view att
     if (kind_ == Kind::CURVE && attribute == attribute::kRot) {
       rotation_ = value == kCounterClockwise ? 1 : value == kClockwise ? -1 : 0;
     } else if (kind_ == Kind::CURVE && attribute == attribute::kRadius) {
-      if (!point_files::parseNumber(value, radius_)) radius_ = kNoValue;
+      if (context_.readCoordinates(value, &radius_, 1) != 1) radius_ = kNoValue;  // in the points' unit
     } else {
       context_.notHeld(name, attribute);
     }

@@ -126,13 +126,17 @@ TEST_F(LandXmlImport, UnitsBecomeTheSettingsUnitsAndCoordinatesMeters) {
   };
   for (const Case& c : cases) {
     const std::string element = std::string(c.units).find("meter") != std::string::npos ? metric : imperial;
-    const LandXmlRun run = importText(document(cgPoints("<CgPoint name=\"P\">1 2 3</CgPoint>"),
-                                               element + c.units + " pressureUnit=\"HPA\"/>"));
+    const std::string units = element + c.units + " pressureUnit=\"HPA\"/>";
+    const LandXmlRun run = importText(document(cgPoints("<CgPoint name=\"P\">1 2 3</CgPoint>"), units));
     ASSERT_EQ(DEX_RESULT_OK, run.result) << c.units;
     EXPECT_NEAR(c.north, pointAt(run, 0)->getStation().getX(), 1e-12) << c.units;
     EXPECT_NEAR(3 * c.north, pointAt(run, 0)->getStation().getZ(), 1e-9) << c.units;
     EXPECT_EQ(c.distUnits, run.data().getSettings().distUnits) << c.units;
     EXPECT_EQ(c.angleUnits, run.data().getSettings().angleUnits) << c.units;
+    // A curve's radius is in the unit of its points: a quarter circle.
+    const LandXmlRun arc = importText(document(
+        planFeature("<Curve rot=\"ccw\" radius=\"10\"><Start>0 10</Start><End>10 0</End></Curve>"), units));
+    EXPECT_NEAR(std::tan(kPi / 8), polylineAt(arc, 0)->getNodeBulge(0), 1e-9) << c.units;
   }
 }
 
