@@ -81,7 +81,8 @@ LandXmlExporter::~LandXmlExporter() {
 }
 
 int LandXmlExporter::getNumberOfSteps() {
-  return 2 + (objectCount_ + kObjectsPerStep - 1) / kObjectsPerStep;
+  const int alignments = dataset_ != nullptr ? dataset_->getNumberOfAlignments() : 0;  // one a step
+  return 2 + (objectCount_ + kObjectsPerStep - 1) / kObjectsPerStep + alignments;
 }
 
 bool LandXmlExporter::singleStep() {
