@@ -2,7 +2,8 @@
 # Installs the Debian packages the build needs when they are missing; a no-op when all are present.
 set -euo pipefail
 
-packages=(cmake g++ make pkg-config libxml2-dev googletest libgtest-dev libgmock-dev libbenchmark-dev locales gcovr
+packages=(cmake g++ make pkg-config libxml2-dev libxml2-utils googletest libgtest-dev libgmock-dev libbenchmark-dev
+  locales gcovr
   python3)  # the tool tests read its JSON reports with Python's json module
 # The independent DXF readers and writers the DXF tests compare against (/usr/bin/python3 sees python3-ezdxf).
 packages+=(python3-ezdxf gdal-bin)

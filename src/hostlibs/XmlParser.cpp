@@ -1,5 +1,6 @@
 #include "hostlibs/XmlParser.h"
 
+#include <algorithm>
 #include <string>
 #include <string_view>
 
@@ -12,6 +13,17 @@ using String = CVynStringT<wchar_t>;
 
 std::wstring_view viewOf(const wchar_t* text) noexcept {
   return text == nullptr ? std::wstring_view() : std::wstring_view(text);
+}
+
+// Replaces target with text, reusing target's memory.
+void assignText(String& target, const std::wstring& text) {
+  if (text.empty()) {
+    target.Empty();
+    return;
+  }
+  const int length = static_cast<int>(text.size());
+  std::copy(text.begin(), text.end(), target.GetBuffer(length));
+  target.ReleaseBuffer(length);
 }
 
 String stringOf(const std::wstring& text) {
@@ -56,12 +68,31 @@ void CXmlParserBase::Close() noexcept {
 }
 
 bool CXmlParserBase::ReadToken(String& tag, String& attributes, String& value) {
-  vyn_text::detail::XmlToken token;
-  const bool read = reader_ != nullptr && reader_->next(token);
-  tag = stringOf(token.tag);
-  attributes = stringOf(token.attributes);
-  value = stringOf(token.value);
-  return read;
+  const vyn_text::detail::XmlToken* const token = reader_ != nullptr ? reader_->next() : nullptr;
+  if (token == nullptr) {
+    tag.Empty();
+    attributes.Empty();
+    value.Empty();
+    return false;
+  }
+  // Assigning into the caller's strings reuses their memory: a reader that keeps its three strings
+  // reads a long document without a heap block per token.
+  assignText(tag, token->tag);
+  assignText(attributes, token->attributes);
+  assignText(value, token->value);
+  return true;
+}
+
+bool CXmlParserBase::ReadToken(std::wstring_view& tag, std::wstring_view& attributes, std::wstring_view& value) {
+  const vyn_text::detail::XmlToken* const token = reader_ != nullptr ? reader_->next() : nullptr;
+  if (token == nullptr) {
+    tag = attributes = value = std::wstring_view();
+    return false;
+  }
+  tag = token->tag;
+  attributes = token->attributes;
+  value = token->value;
+  return true;
 }
 
 String CXmlParserBase::ReadAttrib(const String& attributes, const wchar_t* name) {
@@ -73,6 +104,16 @@ String CXmlParserBase::ReadAttrib(const String& attributes, const wchar_t* name)
     return false;
   });
   return stringOf(found);
+}
+
+void CXmlParserBase::ForEachAttrib(std::wstring_view attributes,
+                                   const std::function<bool(std::wstring_view, std::wstring_view)>& visit) {
+  std::wstring unescaped;
+  vyn_text::detail::forEachXmlAttribute(attributes, [&](std::wstring_view key, std::wstring_view raw) {
+    if (raw.find(L'&') == std::wstring_view::npos) return visit(key, raw);
+    unescaped = vyn_text::detail::unescapeXml(raw);
+    return visit(key, unescaped);
+  });
 }
 
 bool CXmlParserBase::IsUTF8() const noexcept {

@@ -1,6 +1,8 @@
 #pragma once
 
+#include <functional>
 #include <memory>
+#include <string_view>
 
 #include "hostlibs/DexApi.h"
 #include "hostlibs/TextFile.h"
@@ -74,10 +76,19 @@ class DEX_API CXmlParserBase {
   // Reading. Gives the next token (see above); false at the end of the document, after a fault in it,
   // or when no document is open; the three strings are then emptied.
   bool ReadToken(CVynStringT<wchar_t>& tag, CVynStringT<wchar_t>& attributes, CVynStringT<wchar_t>& value);
+  // The same token as views into the reader's own strings, valid until the next read or Close: for
+  // readers of large documents that copy only what they keep. Empty views with false at the end.
+  bool ReadToken(std::wstring_view& tag, std::wstring_view& attributes, std::wstring_view& value);
 
   // The unescaped value of the first attribute called name (exact, case-sensitive) in a serialised
   // attribute list; empty when there is none.
   static CVynStringT<wchar_t> ReadAttrib(const CVynStringT<wchar_t>& attributes, const wchar_t* name);
+  // Calls visit(name, value) for each attribute of a serialised attribute list, in order, with the value
+  // unescaped, until visit answers false. Both views are valid during the call only. For readers that
+  // take many attributes of many elements: one pass, and no string made for a value without references.
+  static void ForEachAttrib(
+      std::wstring_view attributes,
+      const std::function<bool(std::wstring_view name, std::wstring_view value)>& visit);
 
   // The encoding of the open document, judged from its start: UTF-16 when it begins with a UTF-16
   // byte-order mark or with "<?" in UTF-16; UTF-8 when it begins with the UTF-8 mark, or is 8-bit

@@ -1,5 +1,6 @@
 #include "hostlibs/detail/Utf.h"
 
+#include <algorithm>
 #include <array>
 
 namespace vyn_text::detail {
@@ -45,6 +46,18 @@ constexpr std::array<char16_t, 32> kCp1252High = {
 void appendUtf8(std::wstring& out, std::string_view bytes) {
   out.reserve(out.size() + bytes.size());
   while (!bytes.empty()) {
+    // The common case: a run of ASCII, one byte a character.
+    std::size_t run = 0;
+    while (run < bytes.size() && static_cast<unsigned char>(bytes[run]) < 0x80)
+      ++run;
+    if (run > 0) {
+      const std::size_t at = out.size();
+      out.resize(at + run);
+      std::copy(bytes.begin(), bytes.begin() + static_cast<std::ptrdiff_t>(run),
+                out.begin() + static_cast<std::ptrdiff_t>(at));
+      bytes.remove_prefix(run);
+      continue;
+    }
     char32_t decoded = 0;
     std::size_t used = wellFormedLength(bytes, decoded);
     if (used == 0) {

@@ -50,9 +50,10 @@ class QuietLibxml {
   void* previousContext_;
 };
 
-std::wstring wide(const xmlChar* utf8) {
-  if (utf8 == nullptr) return {};
-  return fromUtf8(reinterpret_cast<const char*>(utf8));
+// Replaces out with the wide form of utf8 (nothing for null), reusing its memory.
+void assignWide(std::wstring& out, const xmlChar* utf8) {
+  out.clear();
+  if (utf8 != nullptr) appendUtf8(out, reinterpret_cast<const char*>(utf8));
 }
 
 bool isBlank(std::wstring_view text) {
@@ -87,33 +88,53 @@ XmlTokenReader::OpenResult XmlTokenReader::open(const wchar_t* path) {
     return OpenResult::NotXml;
   }
   xmlTextReaderSetStructuredErrorHandler(reader_.get(), ignoreStructuredError, nullptr);
-  if (prolog_.hasDeclaration)
-    ready_.push_back({std::wstring(), prolog_.declarationAttributes, std::wstring()});
-  if (!step()) {
-    ready_.clear();
+  if (prolog_.hasDeclaration) pushToken().attributes = prolog_.declarationAttributes;
+  bool started = false;
+  {
+    const QuietLibxml quiet;
+    started = step();
+  }
+  if (!started) {
+    head_ = used_ = 0;
     return OpenResult::NotXml;
   }
   return OpenResult::Opened;
 }
 
-bool XmlTokenReader::next(XmlToken& token) {
-  while (ready_.empty() && step()) {
+const XmlToken* XmlTokenReader::next() {
+  if (handedOut_) {
+    handedOut_ = false;
+    if (++head_ == used_) head_ = used_ = 0;
   }
-  if (ready_.empty()) return false;
-  token = std::move(ready_.front());
-  ready_.pop_front();
-  return true;
+  if (head_ == used_) refill();
+  if (head_ == used_) return nullptr;
+  handedOut_ = true;
+  return &slots_[head_];
 }
 
-// Reads one node and turns it into tokens; false (and the reader released) at the end or a fault.
+XmlToken& XmlTokenReader::pushToken() {
+  if (used_ == slots_.size()) slots_.emplace_back();
+  XmlToken& token = slots_[used_++];
+  token.tag.clear();
+  token.attributes.clear();
+  token.value.clear();
+  return token;
+}
+
+// Reads nodes until tokens are ready and, to spread the cost of silencing libxml2 over many nodes, on
+// up to kNodesPerRefill nodes.
+void XmlTokenReader::refill() {
+  const QuietLibxml quiet;
+  for (int nodes = 0; reader_ && (head_ == used_ || nodes < kNodesPerRefill); ++nodes) {
+    if (!step()) return;
+  }
+}
+
+// Reads one node and turns it into tokens; false (and the reader released) at the end or a fault. The
+// caller silences libxml2.
 bool XmlTokenReader::step() {
   if (!reader_) return false;
-  int read = 0;
-  {
-    const QuietLibxml quiet;
-    read = xmlTextReaderRead(reader_.get());
-  }
-  if (read != 1) {
+  if (xmlTextReaderRead(reader_.get()) != 1) {
     finish();
     return false;
   }
@@ -140,38 +161,62 @@ bool XmlTokenReader::step() {
   return true;
 }
 
+// libxml2's reader hands out names from its dictionary (XML_PARSE_NODICT is never set): one copy of
+// each name, kept for the life of the reader, so a name's wide form can be kept by the address of
+// its copy.
+const std::wstring& XmlTokenReader::nameOf(const xmlChar* utf8) {
+  if (utf8 == nullptr) {
+    uncachedName_.clear();
+    return uncachedName_;
+  }
+  NameEntry& entry = names_[(reinterpret_cast<std::uintptr_t>(utf8) >> 3) % names_.size()];
+  if (entry.key != utf8) {
+    entry.key = utf8;
+    assignWide(entry.name, utf8);
+  }
+  return entry.name;
+}
+
 void XmlTokenReader::startElement() {
   flushText();
   _xmlTextReader* const reader = reader_.get();
-  std::wstring name = wide(xmlTextReaderConstName(reader));
-  std::wstring attributes;
+  XmlToken& start = pushToken();
+  start.tag = nameOf(xmlTextReaderConstName(reader));
   while (xmlTextReaderMoveToNextAttribute(reader) == 1) {
-    if (!attributes.empty()) attributes += L' ';
-    appendXmlAttribute(attributes, wide(xmlTextReaderConstName(reader)),
-                       wide(xmlTextReaderConstValue(reader)));
+    if (!start.attributes.empty()) start.attributes += L' ';
+    const std::wstring& name = nameOf(xmlTextReaderConstName(reader));
+    assignWide(attributeValue_, xmlTextReaderConstValue(reader));
+    appendXmlAttribute(start.attributes, name, attributeValue_);
   }
   xmlTextReaderMoveToElement(reader);
-  const bool empty = xmlTextReaderIsEmptyElement(reader) == 1;
-  ready_.push_back({name, std::move(attributes), std::wstring()});
-  if (empty) {
-    ready_.push_back({L"/" + name, std::wstring(), std::wstring()});
-  } else {
-    openElements_.push_back(std::move(name));
+  if (xmlTextReaderIsEmptyElement(reader) == 1) {
+    XmlToken& end = pushToken();
+    end.tag = L'/';
+    end.tag += slots_[used_ - 2].tag;
+    return;
   }
+  if (depth_ == openElements_.size()) openElements_.emplace_back();
+  openElements_[depth_++] = start.tag;
 }
 
 void XmlTokenReader::endElement() {
   flushText();
-  std::wstring name =
-      openElements_.empty() ? wide(xmlTextReaderConstName(reader_.get())) : openElements_.back();
-  if (!openElements_.empty()) openElements_.pop_back();
-  ready_.push_back({L"/" + name, std::wstring(), std::wstring()});
+  XmlToken& end = pushToken();
+  end.tag = L'/';
+  if (depth_ == 0) {
+    end.tag += nameOf(xmlTextReaderConstName(reader_.get()));
+    return;
+  }
+  end.tag += openElement();
+  --depth_;
 }
 
 // Text between two tags becomes one token named after the element that holds it, unless it is blank.
 void XmlTokenReader::flushText() {
   if (!isBlank(text_)) {
-    ready_.push_back({openElements_.empty() ? std::wstring() : openElements_.back(), std::wstring(), text_});
+    XmlToken& token = pushToken();
+    if (depth_ > 0) token.tag = openElement();
+    token.value = text_;
   }
   text_.clear();
 }
@@ -181,7 +226,9 @@ void XmlTokenReader::finish() noexcept {
   reader_.reset();
   file_.reset();
   text_.clear();
-  openElements_.clear();
+  depth_ = 0;
+  for (NameEntry& entry : names_)
+    entry.key = nullptr;
 }
 
 }  // namespace vyn_text::detail
