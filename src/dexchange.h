@@ -65,6 +65,7 @@
 #include "ieObjects/IERawDataEquipment.h"
 #include "ieObjects/IERawDataSummary.h"
 #include "ieObjects/IERegion.h"
+#include "ieObjects/IERoadStrings.h"
 #include "ieObjects/IEScanningSession.h"
 #include "ieObjects/IEStakeoutReports.h"
 #include "ieObjects/IEStation.h"
