@@ -81,6 +81,8 @@
 #include "ieUtils/IEAsciiFields.h"
 #include "ieUtils/IEAutoCADUtils.h"
 #include "ieUtils/IEFileReaders.h"
+#include "ieUtils/IEMultipleFilesRoadExporter.h"
+#include "ieUtils/IEMultipleFilesRoadImporter.h"
 #include "ieUtils/IELinework.h"
 #include "ieUtils/IELocalization.h"
 #include "ieUtils/IENaturalNames.h"
