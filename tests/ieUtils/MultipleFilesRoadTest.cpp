@@ -41,13 +41,6 @@ std::string modeName(const ::testing::TestParamInfo<RunMode>& info) {
   return info.param == RunMode::CALLERS_THREAD ? "InTheCallersThread" : "InAWorkerThread";
 }
 
-DexSettings settingsFor(std::initializer_list<EDexDataType> types) {
-  DexSettings settings;
-  for (const EDexDataType type : types)
-    settings.addDataType(type);
-  return settings;
-}
-
 // A message box that refuses every overwrite.
 class RefusingMessageBox : public IDexMessageBox {
  public:
@@ -88,6 +81,15 @@ void addRoad(DexData& data, const wchar_t* name, int items = 1) {
     alignment->setAlignmentPart(part);
   }
   data.getCurDataset()->add(alignment);
+}
+
+// Data requesting ROADS with a dataset holding roads named names.
+std::unique_ptr<DexData> roadsData(std::initializer_list<const wchar_t*> names, const DexSettings& settings) {
+  auto data = std::make_unique<DexData>(settings);
+  data->addDataset(new DexDataset(L"Roads"));
+  for (const wchar_t* name : names)
+    addRoad(*data, name);
+  return data;
 }
 
 class MultipleFilesRoadRun : public ::testing::TestWithParam<RunMode> {
@@ -139,138 +141,20 @@ TEST_P(MultipleFilesRoadRun, ImportsTheRequestedPartsAndJoinsThemForRoads) {
     double staStart;
     int alignmentParts;
   } cases[] = {
-      {"all three files",
-       {ROADS},
-       "R1 2 100",
-       "V1 1",
-       "X1 3",
-       "road.thal",
-       DEX_RESULT_OK,
-       {1, 1, 1},
-       L"R1",
-       100,
-       3},
-      {"any of the three chosen",
-       {ROADS},
-       "R1 2 100",
-       "V1 1",
-       "X1 3",
-       "road.txs",
-       DEX_RESULT_OK,
-       {1, 1, 1},
-       L"R1",
-       100,
-       3},
-      {"missing cross sections",
-       {ROADS},
-       "R1 2",
-       "V1 1",
-       nullptr,
-       "road.thal",
-       DEX_RESULT_WRONG_FORMAT,
-       {1, 1, 0},
-       nullptr,
-       0,
-       0},
-      {"empty horizontal file",
-       {ROADS},
-       "",
-       "V1 1 5",
-       "X1 1",
-       "road.thal",
-       DEX_RESULT_OK,
-       {0, 1, 1},
-       L"V1",
-       0,
-       2},
-      {"unreadable horizontal",
-       {ROADS},
-       "bad",
-       "V1 1",
-       "X1 1",
-       "road.thal",
-       DEX_RESULT_WRONG_FORMAT,
-       {0, 0, 0},
-       nullptr,
-       0,
-       0},
-      {"unreadable vertical",
-       {ROADS},
-       "R1 1",
-       "bad",
-       "X1 1",
-       "road.thal",
-       DEX_RESULT_WRONG_FORMAT,
-       {1, 0, 0},
-       nullptr,
-       0,
-       0},
-      {"only cross sections",
-       {ROADS},
-       nullptr,
-       nullptr,
-       "X1 1",
-       "road.thal",
-       DEX_RESULT_WRONG_FORMAT,
-       {0, 0, 0},
-       nullptr,
-       0,
-       0},
-      {"no file at all",
-       {ROADS},
-       nullptr,
-       nullptr,
-       nullptr,
-       "road.thal",
-       DEX_RESULT_FILE_ERROR,
-       {0, 0, 0},
-       nullptr,
-       0,
-       0},
-      {"vertical from the chosen file",
-       {V_ALIGNMENTS},
-       "R1 1",
-       nullptr,
-       nullptr,
-       "road.thal",
-       DEX_RESULT_OK,
-       {0, 1, 0},
-       nullptr,
-       0,
-       0},
-      {"unreadable chosen horizontal",
-       {H_ALIGNMENTS},
-       "bad",
-       nullptr,
-       nullptr,
-       "road.thal",
-       DEX_RESULT_WRONG_FORMAT,
-       {0, 0, 0},
-       nullptr,
-       0,
-       0},
-      {"two kinds from the chosen file",
-       {H_ALIGNMENTS, X_SECTIONS},
-       "R1 1",
-       "V1 1",
-       nullptr,
-       "road.thal",
-       DEX_RESULT_OK,
-       {1, 0, 1},
-       nullptr,
-       0,
-       0},
-      {"no road type requested",
-       {POINTS},
-       "R1 1",
-       "V1 1",
-       "X1 1",
-       "road.thal",
-       DEX_RESULT_FILE_ERROR,
-       {0, 0, 0},
-       nullptr,
-       0,
-       0},
+      // clang-format off
+      {"all three files", {ROADS}, "R1 2 100", "V1 1", "X1 3", "road.thal", DEX_RESULT_OK, {1, 1, 1}, L"R1", 100, 3},
+      {"any of the three chosen", {ROADS}, "R1 2 100", "V1 1", "X1 3", "road.txs", DEX_RESULT_OK, {1, 1, 1}, L"R1", 100, 3},
+      {"missing cross sections", {ROADS}, "R1 2", "V1 1", nullptr, "road.thal", DEX_RESULT_WRONG_FORMAT, {1, 1, 0}, nullptr, 0, 0},
+      {"empty horizontal file", {ROADS}, "", "V1 1 5", "X1 1", "road.thal", DEX_RESULT_OK, {0, 1, 1}, L"V1", 0, 2},
+      {"unreadable horizontal", {ROADS}, "bad", "V1 1", "X1 1", "road.thal", DEX_RESULT_WRONG_FORMAT, {0, 0, 0}, nullptr, 0, 0},
+      {"unreadable vertical", {ROADS}, "R1 1", "bad", "X1 1", "road.thal", DEX_RESULT_WRONG_FORMAT, {1, 0, 0}, nullptr, 0, 0},
+      {"only cross sections", {ROADS}, nullptr, nullptr, "X1 1", "road.thal", DEX_RESULT_WRONG_FORMAT, {0, 0, 0}, nullptr, 0, 0},
+      {"no file at all", {ROADS}, nullptr, nullptr, nullptr, "road.thal", DEX_RESULT_FILE_ERROR, {0, 0, 0}, nullptr, 0, 0},
+      {"vertical from the chosen file", {V_ALIGNMENTS}, "R1 1", nullptr, nullptr, "road.thal", DEX_RESULT_OK, {0, 1, 0}, nullptr, 0, 0},
+      {"unreadable chosen horizontal", {H_ALIGNMENTS}, "bad", nullptr, nullptr, "road.thal", DEX_RESULT_WRONG_FORMAT, {0, 0, 0}, nullptr, 0, 0},
+      {"two kinds from the chosen file", {H_ALIGNMENTS, X_SECTIONS}, "R1 1", "V1 1", nullptr, "road.thal", DEX_RESULT_OK, {1, 0, 1}, nullptr, 0, 0},
+      {"no road type requested", {POINTS}, "R1 1", "V1 1", "X1 1", "road.thal", DEX_RESULT_FILE_ERROR, {0, 0, 0}, nullptr, 0, 0},
+      // clang-format on
   };
   for (const auto& c : cases) {
     SCOPED_TRACE(c.what);
@@ -279,7 +163,7 @@ TEST_P(MultipleFilesRoadRun, ImportsTheRequestedPartsAndJoinsThemForRoads) {
          {std::pair{"road.thal", c.hal}, {"road.tval", c.tval}, {"road.txs", c.txs}}) {
       if (text != nullptr) dir.write(name, *text != 0 ? std::string(text) + "\n" : std::string());
     }
-    DexData data(settingsFor(c.types));
+    DexData data(dex_test::settingsWith(c.types));
     data.addDataset(new DexDataset(L"Roads"));
     EXPECT_EQ(c.result, run(true, dir.wfile(c.chosen), data));
     const DexAlignmentPartsDictionary& dictionary = *data.getIEAlignmentPartsDictionary();
@@ -298,7 +182,7 @@ TEST_P(MultipleFilesRoadRun, ImportsTheRequestedPartsAndJoinsThemForRoads) {
 
 TEST_P(MultipleFilesRoadRun, ImportStoppedWhileReadingAnswersStopped) {
   dir_.write("road.thal", "R1 1\n");
-  DexData data(settingsFor({H_ALIGNMENTS}));
+  DexData data(dex_test::settingsWith({H_ALIGNMENTS}));
   DexData::stopProcess_ = true;
   EXPECT_EQ(DEX_RESULT_STOPPED, run(true, dir_.wfile("road.thal"), data));
 }
@@ -306,7 +190,7 @@ TEST_P(MultipleFilesRoadRun, ImportStoppedWhileReadingAnswersStopped) {
 // ---- Export ---------------------------------------------------------------------------------------
 
 TEST_P(MultipleFilesRoadRun, ExportsEachRoadIntoThreeFilesNamedAfterIt) {
-  DexData data(settingsFor({ROADS}));
+  DexData data(dex_test::settingsWith({ROADS}));
   data.addDataset(new DexDataset(L"Roads"));
   addRoad(data, L"R1", 2);
   addRoad(data, L"R2", 1);
@@ -318,7 +202,7 @@ TEST_P(MultipleFilesRoadRun, ExportsEachRoadIntoThreeFilesNamedAfterIt) {
 }
 
 TEST_P(MultipleFilesRoadRun, ExportsPartsUnderTheirOwnNamesAndSkipsEmptyOnes) {
-  DexData data(settingsFor({H_ALIGNMENTS, V_ALIGNMENTS}));
+  DexData data(dex_test::settingsWith({H_ALIGNMENTS, V_ALIGNMENTS}));
   DexAlignmentPartsDictionary& dictionary = *data.getIEAlignmentPartsDictionary();
   dictionary.addAlignmentPart(named<DexHorizontalAlignment>(L"A", 1));
   dictionary.addAlignmentPart(named<DexHorizontalAlignment>(L"Empty", 0));
@@ -330,10 +214,8 @@ TEST_P(MultipleFilesRoadRun, ExportsPartsUnderTheirOwnNamesAndSkipsEmptyOnes) {
 }
 
 TEST_P(MultipleFilesRoadRun, StopBetweenStepsDeletesEveryFileWrittenSoFar) {
-  DexData data(settingsFor({ROADS}));
-  data.addDataset(new DexDataset(L"Roads"));
-  addRoad(data, L"R1");
-  addRoad(data, L"R2");
+  const auto owned = roadsData({L"R1", L"R2"}, dex_test::settingsWith({ROADS}));
+  DexData& data = *owned;
   const std::string folder = dir_.file("out");
   std::filesystem::create_directory(folder);
   dir_.write("out.script", "stop-after-step 0\n");
@@ -343,11 +225,10 @@ TEST_P(MultipleFilesRoadRun, StopBetweenStepsDeletesEveryFileWrittenSoFar) {
 }
 
 TEST_P(MultipleFilesRoadRun, RefusedOverwriteOfOneFileLeavesItAndWritesTheOtherTwo) {
-  DexSettings settings = settingsFor({ROADS});
+  DexSettings settings = dex_test::settingsWith({ROADS});
   settings.messageBox = new RefusingMessageBox;
-  DexData data(settings);
-  data.addDataset(new DexDataset(L"Roads"));
-  addRoad(data, L"R1");
+  const auto owned = roadsData({L"R1"}, settings);
+  DexData& data = *owned;
   dir_.write("R1.tval", "old\n");
   EXPECT_EQ(DEX_RESULT_FILE_ERROR, run(false, dir_.wpath(), data));
   EXPECT_EQ("old\n", dex_test::readFile(dir_.file("R1.tval")));
@@ -404,10 +285,8 @@ TEST(MultipleFilesRoadExporter, CountsOneStepPerItemOfTheFirstRequestedKindPlusO
   };
   for (const auto& c : cases) {
     dex_test::LogCapture log;
-    DexData data(settingsFor(c.types));
-    data.addDataset(new DexDataset(L"Roads"));
-    addRoad(data, L"R1");
-    addRoad(data, L"R2");
+    const auto owned = roadsData({L"R1", L"R2"}, dex_test::settingsWith(c.types));
+    DexData& data = *owned;
     data.getIEAlignmentPartsDictionary()->addAlignmentPart(named<DexHorizontalAlignment>(L"H3", 1));
     RecordingExporter exporter(&data, L"/tmp");
     EXPECT_EQ(c.steps, exporter.getNumberOfSteps());
@@ -418,10 +297,8 @@ TEST(MultipleFilesRoadExporter, CountsOneStepPerItemOfTheFirstRequestedKindPlusO
 
 TEST(MultipleFilesRoadExporter, WritesEachAlignmentsPrimaryPartsAndEndsAfterTheLast) {
   const TempDir dir;
-  DexData data(settingsFor({ROADS}));
-  data.addDataset(new DexDataset(L"Roads"));
-  addRoad(data, L"R1");
-  addRoad(data, L"R2");
+  const auto owned = roadsData({L"R1", L"R2"}, dex_test::settingsWith({ROADS}));
+  DexData& data = *owned;
   RecordingExporter exporter(&data, dir.wpath());
   EXPECT_TRUE(exporter.singleStep());
   EXPECT_TRUE(exporter.singleStep());
@@ -439,7 +316,7 @@ TEST(MultipleFilesRoadExporter, WritesEachAlignmentsPrimaryPartsAndEndsAfterTheL
 
 TEST(MultipleFilesRoadExporter, AFileThatCannotBeCreatedSetsTheFileError) {
   const TempDir dir;
-  DexData data(settingsFor({H_ALIGNMENTS}));
+  DexData data(dex_test::settingsWith({H_ALIGNMENTS}));
   data.getIEAlignmentPartsDictionary()->addAlignmentPart(named<DexHorizontalAlignment>(L"A", 1));
   RecordingExporter exporter(&data, dir.wfile("missing-folder"));
   exporter.singleStep();
