@@ -43,7 +43,7 @@ sanitize: deps
 
 # The runs in worker threads under ThreadSanitizer: the loader's and the run functions' tests and the
 # real plug-ins run through the loader.
-TSAN_TESTS ?= ParsersLoader|ImporterExporter|RunProgress|PointFiles\.
+TSAN_TESTS ?= ParsersLoader|ImporterExporter|RunProgress|MultipleFilesRoad|PointFiles\.
 tsan: deps
 	cmake -S . -B $(TSAN_DIR) -DCMAKE_BUILD_TYPE=Debug -DDEXCHANGE_TSAN=ON $(CMAKE_ARGS)
 	cmake --build $(TSAN_DIR) -j$(JOBS) --target dexchange_ieUtils_tests dexchange_tools_tests

@@ -5,6 +5,7 @@
 #include <cstddef>
 
 #include "hostlibs/VynLogging.h"
+#include "ieObjects/IERoadStrings.h"
 #include "ieObjects/detail/AlignmentLog.h"
 
 namespace vyn::ie {
@@ -21,10 +22,11 @@ bool isPartType(int type) noexcept {
   return type >= 0 && type < IDexAlignmentPart::kNumberOfPartTypes;
 }
 
-// Whether the road-string set names part in one of its pairs. The model has no road-string set class
-// yet, so no set can name a part; the road strings answer this once they exist.
-bool isNamedByRoadStringSet(const IDexAlignmentPart& /*roadStringSet*/, const IDexAlignmentPart& /*part*/) {
-  return false;
+// Whether the road-string set names part in one of its pairs. A plug-in's own part class that merely
+// answers the road-string kind names nothing.
+bool isNamedByRoadStringSet(const IDexAlignmentPart& roadStringSet, const IDexAlignmentPart& part) {
+  const auto* const set = dynamic_cast<const DexRoadStringSet*>(&roadStringSet);
+  return set != nullptr && set->isAlignmentPartUsed(&part);
 }
 
 }  // namespace

@@ -29,13 +29,6 @@ using dex_test::TempDir;
 const std::wstring kImporterSource = L"ieUtils\\IImporter";
 const std::wstring kExporterSource = L"ieUtils\\IExporter";
 
-DexSettings settingsWith(std::initializer_list<EDexDataType> types) {
-  DexSettings settings;
-  for (const EDexDataType type : types)
-    settings.addDataType(type);
-  return settings;
-}
-
 // ---- Importers ----------------------------------------------------------------------------------------
 
 class PlainImporter : public DexImporterImpl {
@@ -55,18 +48,18 @@ class PlainImporter : public DexImporterImpl {
 TEST(ImporterExporterImporter, AddsTheImportDatasetToAnEmptyContainerForObjectData) {
   for (const EDexDataType type : {POINTS, LINES, AREAS, PARCELS, ROADS, SURFACES, POINT_LISTS, ROAD_SURVEY,
                                   SCANNING_DATA, JOB_HISTORY, RAW_DATA, MULTIPLE}) {
-    DexData data(settingsWith({type}));
+    DexData data(dex_test::settingsWith({type}));
     const PlainImporter importer(&data, L"in.txt", nullptr);
     ASSERT_EQ(1, data.getNumberOfDatasets()) << "data type " << type;
     EXPECT_EQ(L"Import dataset", std::wstring(data.getDatasetAt(0)->getName().view()));
   }
   for (const EDexDataType type :
        {CODES, H_ALIGNMENTS, X_SECTION_TEMPLATES, LOCALIZATION, STA_EQUATION_SETS}) {
-    DexData data(settingsWith({type}));
+    DexData data(dex_test::settingsWith({type}));
     const PlainImporter importer(&data, L"in.txt", nullptr);
     EXPECT_EQ(0, data.getNumberOfDatasets()) << "data type " << type;
   }
-  DexData data(settingsWith({POINTS}));  // nor to a container that has datasets
+  DexData data(dex_test::settingsWith({POINTS}));  // nor to a container that has datasets
   data.addDataset(new DexDataset(L"first", 0, false));
   data.addDataset(new DexDataset(L"second", 0, false));
   const PlainImporter importer(&data, L"in.txt", nullptr);
@@ -76,7 +69,7 @@ TEST(ImporterExporterImporter, AddsTheImportDatasetToAnEmptyContainerForObjectDa
 }
 
 TEST(ImporterExporterImporter, CopiesShareTheContainerAndTheFormat) {
-  DexData data(settingsWith({POINTS}));
+  DexData data(dex_test::settingsWith({POINTS}));
   const DexFormat format = dex_test::scriptedFormat();
   const PlainImporter importer(&data, L"in.txt", &format);
   const PlainImporter copy(importer);
@@ -136,7 +129,7 @@ class StepExporter : public DexExporterImpl {
 class ImporterExporterDriver : public ::testing::Test {
  protected:
   dex_test::StopFlagReset stopFlag_;
-  DexData data_{settingsWith({POINTS})};
+  DexData data_{dex_test::settingsWith({POINTS})};
 };
 
 TEST_F(ImporterExporterDriver, StepsUntilTheLastAndReportsTheResultSetThen) {
@@ -338,7 +331,7 @@ TEST_F(ImporterExporterRunFunctions, NotifiesSuccessAndFailureOnlyForAThreadOfIt
 }
 
 TEST_F(ImporterExporterRunFunctions, AMissingNotifierLeavesItsLogLineOnly) {
-  DexData bare(settingsWith({POINTS}));
+  DexData bare(dex_test::settingsWith({POINTS}));
   LogCapture capture;
   EXPECT_EQ(DEX_RESULT_OK, ImportFunction(newParams(&bare, &format_, &makePlainImporter, true)));
   EXPECT_EQ(1, capture.count(kImporterSource, 92));

@@ -4,6 +4,7 @@
 // that record what they are told, and the stop flag put back after every test.
 
 #include <atomic>
+#include <initializer_list>
 #include <memory>
 #include <string>
 #include <thread>
@@ -88,6 +89,14 @@ struct RecordedSettings {
     settings.exportNotifier = new RecordingNotifier(exports);
   }
 };
+
+// Settings requesting exactly types.
+inline vyn::ie::DexSettings settingsWith(std::initializer_list<vyn::ie::EDexDataType> types) {
+  vyn::ie::DexSettings settings;
+  for (const vyn::ie::EDexDataType type : types)
+    settings.addDataType(type);
+  return settings;
+}
 
 // Clears DexData::stopProcess_ when the test ends, whatever happened.
 class StopFlagReset {

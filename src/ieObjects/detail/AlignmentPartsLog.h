@@ -23,4 +23,9 @@ inline constexpr int kUnknownSpiralMathTypeLine = 815;
 // DexVerticalElement::getData() was asked for datum 8 of an element of type 0, which has none.
 inline constexpr int kVerticalElementDatumLine = 821;
 
+// DexRoadString::addRoadStringPair() was given a null pair.
+inline constexpr int kRoadStringNullPairLine = 831;
+// DexRoadStringSet::addRoadString() was given a null road string.
+inline constexpr int kRoadStringSetNullStringLine = 832;
+
 }  // namespace vyn::ie::detail

@@ -38,4 +38,8 @@ inline constexpr int kExporterThrewLine = 901;
 // The export notifier threw.
 inline constexpr int kExportNotifierThrewLine = 902;
 
+inline constexpr const wchar_t* kMultipleFilesRoadExporterLogSource = L"ieUtils\\IEMultipleFilesRoadExporter";
+// A multi-file road export whose settings request none of ROADS, H_ALIGNMENTS, V_ALIGNMENTS, X_SECTIONS.
+inline constexpr int kNoRoadDataTypeLine = 61;
+
 }  // namespace vyn::ie::detail
