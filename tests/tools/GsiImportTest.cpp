@@ -9,6 +9,7 @@
 
 #include "DxfTestModel.h"
 #include "GsiTestRun.h"
+#include "ToolRun.h"
 #include "gsi/GsiWords.h"
 #include "support/LogCapture.h"
 #include "support/TempDir.h"
@@ -240,6 +241,14 @@ TEST_F(GsiImport, BadInputHasItsDocumentedResultAndKeepsTheGoodWords) {
     EXPECT_EQ(c.records, raw()) << c.what;
     EXPECT_EQ(1, log.countMessage(dex_test::widen(c.note))) << c.what;
   }
+}
+
+TEST_F(GsiImport, TheToolsInfoShowsTheSetUpsAndShots) {
+  const dex_test::ToolRun run = dex_test::runApart("info '" + realFile() + "'");
+  EXPECT_EQ(0, run.exitCode);
+  for (const char* line : {"        backsights: 56", "        sideshots: 86", "        stations: 5",
+                           "      stations set up: 5 (8, 10, 11, 6, 7)"})
+    EXPECT_TRUE(dex_test::contains(run.out, line)) << line << "\n" << run.out;
 }
 
 TEST_F(GsiImport, AMissingFileIsAFileError) {
