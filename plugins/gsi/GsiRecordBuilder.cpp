@@ -54,7 +54,7 @@ bool GsiRecordBuilder::add(const std::vector<GsiWord>& words, std::vector<GsiBad
   using namespace word;
   const bool observed = has(kHorizontalAngle) || has(kVerticalAngle) || has(kSlopeDistance) ||
                         has(kHorizontalDistance) || has(kHeightDifference);
-  const bool located = has(kEasting) || has(kNorthing);
+  const bool located = has(kEasting) || has(kNorthing) || has(kHeight);
   const bool station = has(kStationEasting) || has(kStationNorthing) || has(kStationHeight) ||
                        (has(kInstrumentHeight) && !observed && !located);
   if (station) {
@@ -202,7 +202,8 @@ void GsiRecordBuilder::addShot() {
   record->setIsEmptyName(!named_);
   record->setTSRawData(&values);
   record->setTargetHeight(reflectorHeight_);
-  if (has(kEasting) || has(kNorthing)) record->setXyz(value(kNorthing), value(kEasting), value(kHeight));
+  if (has(kEasting) || has(kNorthing) || has(kHeight))
+    record->setXyz(value(kNorthing), value(kEasting), value(kHeight));
   if (!kept_.empty()) {
     point_files::assignText(text_, kept_);
     record->setNote(text_);

@@ -42,7 +42,7 @@ struct GsiTally {
 //    (CONTENTS_HVD) otherwise, or the two angles (CONTENTS_HV); a sideshot with both keeps the second
 //    form as its second data. The target height is the line's reflector height or the last one met;
 //    the prism constant is stored with the values;
-//  - a line with coordinates (81 to 83) gives a design point (and a shot its computed coordinates);
+//  - a line with a coordinate (81 to 83) gives a design point (and a shot its computed coordinates);
 //  - any other line with text (a code block without a point) is kept as a raw note of its words.
 // Codes (41, 71) become code values (of a point, a sideshot or a station; a backsight's in its note);
 // information and attributes (42 to 49, 72 to 79) and the ppm are kept in the record's note or the

@@ -5,6 +5,7 @@
 #include <cstdint>
 #include <cstdio>
 
+#include "ieObjects/IENoValue.h"
 #include "ieObjects/IEPoints.h"
 #include "ieUtils/IEUtilsUnits.h"
 #include "pointfiles/CodeText.h"
@@ -64,10 +65,12 @@ bool GsiLineWriter::write(const DexDesignPoint& point, int block, std::string& l
   std::snprintf(head, sizeof head, "%02d%04d+", word::kPointNumber, block % kBlockNumbers);
   if (!text(line, head, pointName_, L"point number")) return false;
   const DexStation& station = point.getStation();
-  if (station.isHorizCoordsDefined()) {
-    if (!distance(line, word::kEasting, station.getY(), L"easting")) return false;
-    if (!distance(line, word::kNorthing, station.getX(), L"northing")) return false;
-  }
+  // A point may know one plane coordinate only (a GSI line with 81 or 82 alone): that one is written.
+  const bool plane = station.isHorizCoordsDefined();
+  if ((plane || station.getY() != kNoValue) && !distance(line, word::kEasting, station.getY(), L"easting"))
+    return false;
+  if ((plane || station.getX() != kNoValue) && !distance(line, word::kNorthing, station.getX(), L"northing"))
+    return false;
   if (station.isHeightDefined() && !distance(line, word::kHeight, station.getZ(), L"height")) return false;
   codes_.clear();
   point_files::appendCodesText(point, false, false, codes_);

@@ -20,7 +20,7 @@ namespace vyn::ie::gsi {
 // distance unit (feet for IFEET and USFEET and their feet-and-inches forms, meters otherwise) at the
 // resolution of the settings' coordinate decimals (3 or fewer: 1 mm or 1/1000 ft; 4: 0.1 mm or
 // 1/10000 ft; 5 or more: 0.01 mm, feet staying at 1/10000 ft). A point without height has no word 83,
-// one without plane coordinates no words 81 and 82; each code is a word 71 of its own. Texts are
+// one without a plane coordinate no word 81 or 82 for it; each code is a word 71 of its own. Texts are
 // zero-padded on the left, numbers right-aligned.
 //
 // Nothing is cut or wrapped: a value that does not fit the variant's data width (8 or 16 places), a
