@@ -12,13 +12,11 @@
 #include "gsi/GsiImporter.h"
 #include "gsi/GsiWords.h"
 #include "hostlibs/VynLogging.h"
-#include "ieDefinitions/IEFormatsData.h"
 #include "ieObjects/IEData.h"
 #include "ieObjects/IEDataset.h"
-#include "ieUtils/IEParsersLoader.h"
-#include "ieUtils/IExporter.h"
 #include "support/FuzzCheck.h"
 #include "support/FuzzInput.h"
+#include "support/PluginRun.h"
 #include "support/ScratchFile.h"
 
 namespace {
@@ -28,25 +26,8 @@ using namespace vyn::ie;
 constexpr EDistUnits kUnits[] = {ANY_UNITS, METERS, IFEET, USFEET};
 constexpr int kDecimals[] = {3, 4, 5, 2};
 
-IDexImporter* makeImporter(DexData* data, const CVynStringT<wchar_t>& fileName, const DexFormat* format) {
-  return new gsi::GsiImporter(data, fileName, format);
-}
-
-IDexExporter* makeExporter(DexData* data, const CVynStringT<wchar_t>& fileName, const DexFormat* format) {
-  return new gsi::GsiExporter(data, fileName, format);
-}
-
 EDexResult run(DexData& data, const std::wstring& path, const wchar_t* formatId, bool exportRun) {
-  auto* params = new DexParserThreadParams();
-  params->data = &data;
-  params->fileName = CVynStringT<wchar_t>(path.c_str());
-  params->format = getIEFormatsData().getFormatById(formatId);
-  if (exportRun) {
-    params->makeParser = &makeExporter;
-    return exportFunction(params);
-  }
-  params->makeParser = &makeImporter;
-  return ImportFunction(params);
+  return dex_fuzz::runParser<gsi::GsiImporter, gsi::GsiExporter>(data, path, formatId, exportRun);
 }
 
 struct Content {
@@ -62,13 +43,6 @@ Content contentOf(DexData& data) {
   content.records = dataset.getRawData() == nullptr ? 0 : dataset.getRawData()->getNumberOfRawData();
   return content;
 }
-
-// Answers the overwrite question of the scratch file with yes.
-class Yes final : public IDexMessageBox {
- public:
-  IDexMessageBox* clone() const override { return new Yes(); }
-  int confirmOverwrite(HWND, const wchar_t*) override { return IDYES; }
-};
 
 }  // namespace
 
@@ -90,7 +64,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
   settings.distUnits = kUnits[(steering >> 2) & 3u];
   const int decimals = kDecimals[(steering >> 5) & 3u];
   settings.coordDecimals = {decimals, decimals, decimals};
-  settings.messageBox = new Yes();
+  settings.messageBox = new dex_fuzz::YesBox();
   DexData::stopProcess_ = false;
 
   DexData first(settings);

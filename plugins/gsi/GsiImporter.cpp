@@ -22,8 +22,6 @@ constexpr int kReadBlockSize = 1 << 20;
 // Lines between two looks at the stop flag and two progress reports.
 constexpr int kStopCheckLines = 1024;
 constexpr int kProgressLines = 16384;
-constexpr double kInternationalFoot = 0.3048;
-constexpr double kUsSurveyFoot = 1200.0 / 3937.0;
 
 std::uint64_t fileSizeOf(const CVynStringT<wchar_t>& fileName) {
   std::error_code error;
@@ -90,8 +88,8 @@ EDexResult GsiImporter::doImport() {
   DexRunProgress& progress = data->getProgress();
   progress.setImportPosition(0, bytesTotal);
 
-  const double foot = settings.distUnits == USFEET ? kUsSurveyFoot : kInternationalFoot;
-  GsiRecordBuilder builder(*data, *data->getCurDataset(), withRaw, withPoints, foot);
+  GsiRecordBuilder builder(*data, *data->getCurDataset(), withRaw, withPoints,
+                           metersPerFoot(settings.distUnits));
   GsiImportReport report(fileName);
   GsiLineReader reader;
   std::vector<GsiBadWord> bad;

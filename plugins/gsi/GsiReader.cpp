@@ -46,6 +46,14 @@ bool sexagesimal(std::uint64_t number, double& degrees) {
 
 const wchar_t* kNonDigit = L"a non-digit in the value";
 
+// The data times lastPlace, signed.
+const wchar_t* scaledOf(const GsiWord& word, double lastPlace, double& value) {
+  std::uint64_t number = 0;
+  if (!wholeNumber(word.data, number)) return kNonDigit;
+  value = signedValue(word, static_cast<double>(number) * lastPlace);
+  return nullptr;
+}
+
 }  // namespace
 
 EWordKind kindOf(int index) {
@@ -138,22 +146,20 @@ const wchar_t* angleOf(const GsiWord& word, double& degrees) {
   }
 }
 
-const wchar_t* distanceOf(const GsiWord& word, double metersPerFoot, double& meters) {
-  std::uint64_t number = 0;
-  if (!wholeNumber(word.data, number)) return kNonDigit;
+const wchar_t* distanceOf(const GsiWord& word, double foot, double& meters) {
   double lastPlace = 0.0;
   switch (word.unitDigit) {
     case L'0':
       lastPlace = 1e-3;
       break;
     case L'1':
-      lastPlace = 1e-3 * metersPerFoot;
+      lastPlace = 1e-3 * foot;
       break;
     case L'6':
       lastPlace = 1e-4;
       break;
     case L'7':
-      lastPlace = 1e-4 * metersPerFoot;
+      lastPlace = 1e-4 * foot;
       break;
     case L'8':
       lastPlace = 1e-5;
@@ -161,23 +167,16 @@ const wchar_t* distanceOf(const GsiWord& word, double metersPerFoot, double& met
     default:
       return L"a unit digit that is no distance unit";
   }
-  meters = signedValue(word, static_cast<double>(number) * lastPlace);
-  return nullptr;
+  return scaledOf(word, lastPlace, meters);
 }
 
 const wchar_t* prismConstantOf(const GsiWord& word, double& meters) {
-  std::uint64_t number = 0;
-  if (!wholeNumber(word.data, number)) return kNonDigit;
   const double lastPlace = word.unitDigit == L'6' ? 1e-4 : word.unitDigit == L'8' ? 1e-5 : 1e-3;
-  meters = signedValue(word, static_cast<double>(number) * lastPlace);
-  return nullptr;
+  return scaledOf(word, lastPlace, meters);
 }
 
 const wchar_t* ppmOf(const GsiWord& word, double& ppm) {
-  std::uint64_t number = 0;
-  if (!wholeNumber(word.data, number)) return kNonDigit;
-  ppm = signedValue(word, static_cast<double>(number) / 10.0);
-  return nullptr;
+  return scaledOf(word, 0.1, ppm);
 }
 
 std::wstring_view textOf(const GsiWord& word) {

@@ -55,9 +55,9 @@ class GsiLineReader {
 // that is no angle unit, minutes or seconds of 60 or more).
 const wchar_t* angleOf(const GsiWord& word, double& degrees);
 
-// The value of a distance or coordinate word in meters; feet are metersPerFoot each. Null, or why it
+// The value of a distance or coordinate word in meters; feet are foot meters each. Null, or why it
 // has none (a non-digit, a unit digit that is no distance unit).
-const wchar_t* distanceOf(const GsiWord& word, double metersPerFoot, double& meters);
+const wchar_t* distanceOf(const GsiWord& word, double foot, double& meters);
 
 // The value of a prism-constant word in meters: its data is millimeters to the last place of the unit
 // digit (0.1 mm for 6, 0.01 mm for 8, 1 mm otherwise). Null, or why it has none.

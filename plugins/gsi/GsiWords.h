@@ -5,6 +5,7 @@
 
 #include "ieDefinitions/IEFormats.h"
 #include "ieDefinitions/IEResult.h"
+#include "ieUtils/IEUtilsUnits.h"
 
 // The words, unit digits and limits of Leica GSI that the GSI importer and exporter share.
 //
@@ -77,6 +78,15 @@ enum class EUnit {
 };
 inline constexpr char kFirstUnitDigit = '0';
 inline constexpr char kLastUnitDigit = '8';
+
+// Feet of the unit digits 1 and 7: US survey feet for the settings' US units, international feet
+// otherwise.
+inline constexpr double kInternationalFoot = 0.3048;
+inline constexpr double kUsSurveyFoot = 1200.0 / 3937.0;
+
+constexpr double metersPerFoot(EDistUnits units) {
+  return units == USFEET || units == USFEETINCHES ? kUsSurveyFoot : kInternationalFoot;
+}
 
 // ---- Layout -----------------------------------------------------------------------------------------
 inline constexpr char kGsi16Mark = '*';

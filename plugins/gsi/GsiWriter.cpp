@@ -14,16 +14,10 @@ namespace vyn::ie::gsi {
 
 namespace {
 
-constexpr double kInternationalFoot = 0.3048;
-constexpr double kUsSurveyFoot = 1200.0 / 3937.0;
 constexpr int kBlockNumbers = 10000;
 
 bool isFeet(EDistUnits units) {
   return units == IFEET || units == USFEET || units == IFEETINCHES || units == USFEETINCHES;
-}
-
-bool isUsFeet(EDistUnits units) {
-  return units == USFEET || units == USFEETINCHES;
 }
 
 // 10 to the power places: the first whole number the data cannot hold.
@@ -42,7 +36,7 @@ GsiLineWriter::GsiLineWriter(EVariant variant, const DexSettings& settings) : va
   for (const int d : settings.coordDecimals)
     decimals = std::max(decimals, d);
   if (isFeet(settings.distUnits)) {
-    metersPerUnit_ = isUsFeet(settings.distUnits) ? kUsSurveyFoot : kInternationalFoot;
+    metersPerUnit_ = metersPerFoot(settings.distUnits);
     unitName_ = L"ft";
     const bool fine = decimals >= 4;
     unitDigit_ = fine ? '7' : '1';
