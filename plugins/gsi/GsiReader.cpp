@@ -38,8 +38,9 @@ bool sexagesimal(std::uint64_t number, double& degrees) {
   const auto tenths = static_cast<double>(number % 10);
   const std::uint64_t seconds = (number / 10) % 100;
   const std::uint64_t minutes = (number / 1000) % 100;
+  const std::uint64_t wholeDegrees = number / 100000;
   if (seconds >= kMinutesPerDegree || minutes >= kMinutesPerDegree) return false;
-  degrees = static_cast<double>(number / 100000) + static_cast<double>(minutes) / 60.0 +
+  degrees = static_cast<double>(wholeDegrees) + static_cast<double>(minutes) / 60.0 +
             (static_cast<double>(seconds) + tenths / 10.0) / 3600.0;
   return true;
 }
