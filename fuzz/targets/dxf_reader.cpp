@@ -19,6 +19,7 @@
 #include "ieUtils/IExporter.h"
 #include "support/FuzzCheck.h"
 #include "support/FuzzInput.h"
+#include "support/PluginRun.h"
 #include "support/ScratchFile.h"
 
 namespace {
@@ -27,25 +28,8 @@ using namespace vyn::ie;
 
 constexpr EDistUnits kUnits[] = {ANY_UNITS, METERS, IFEET, USFEET, MILLIMETERS, MILE, INCHES, KILOMETERS};
 
-IDexImporter* makeImporter(DexData* data, const CVynStringT<wchar_t>& fileName, const DexFormat* format) {
-  return new dxf::DxfImporter(data, fileName, format);
-}
-
-IDexExporter* makeExporter(DexData* data, const CVynStringT<wchar_t>& fileName, const DexFormat* format) {
-  return new dxf::DxfExporter(data, fileName, format);
-}
-
 EDexResult run(DexData& data, const std::wstring& path, bool exportRun) {
-  auto* params = new DexParserThreadParams();
-  params->data = &data;
-  params->fileName = CVynStringT<wchar_t>(path.c_str());
-  params->format = getIEFormatsData().getFormatById(dxf::kDxfFormatId);
-  if (exportRun) {
-    params->makeParser = &makeExporter;
-    return exportFunction(params);
-  }
-  params->makeParser = &makeImporter;
-  return ImportFunction(params);
+  return dex_fuzz::runParser<dxf::DxfImporter, dxf::DxfExporter>(data, path, dxf::kDxfFormatId, exportRun);
 }
 
 struct Content {
@@ -64,13 +48,6 @@ Content contentOf(DexData& data) {
     content.triangles += dataset.getSurfaceAt(i)->getNumberOfTriangles();
   return content;
 }
-
-// Answers the overwrite question of the scratch drawing with yes.
-class Yes final : public IDexMessageBox {
- public:
-  IDexMessageBox* clone() const override { return new Yes(); }
-  int confirmOverwrite(HWND, const wchar_t*) override { return IDYES; }
-};
 
 }  // namespace
 
@@ -92,7 +69,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     if ((steering & (1u << bit)) != 0) settings.addDataType(kinds[bit]);
   }
   settings.distUnits = kUnits[(steering >> 4) & 7u];
-  settings.messageBox = new Yes();
+  settings.messageBox = new dex_fuzz::YesBox();
   DexData::stopProcess_ = false;
 
   DexData first(settings);
