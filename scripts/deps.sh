@@ -2,7 +2,7 @@
 # Installs the Debian packages the build needs when they are missing; a no-op when all are present.
 set -euo pipefail
 
-packages=(cmake g++ make pkg-config libxml2-dev googletest libgtest-dev libgmock-dev libbenchmark-dev locales)
+packages=(cmake g++ make pkg-config libxml2-dev googletest libgtest-dev libgmock-dev libbenchmark-dev libmimalloc-dev locales)
 if [[ "${DEXCHANGE_FUZZ:-}" == "ON" ]]; then
   packages+=(clang libclang-rt-dev)
 fi

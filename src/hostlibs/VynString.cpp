@@ -3,7 +3,6 @@
 #include <algorithm>
 #include <array>
 #include <cstdint>
-#include <cstdlib>
 #include <cwchar>
 #include <cwctype>
 #include <new>
@@ -136,13 +135,12 @@ wchar_t* sharedBlockFor(std::wstring_view text) noexcept {
   return sharedCharacters[static_cast<unsigned char>(ch)].chars;
 }
 
-// A heap block for capacity characters; throws std::bad_alloc like the standard strings. The block is
-// released from its characters (String::release), which the analyzer cannot follow.
-// NOLINTBEGIN(clang-analyzer-unix.Malloc)
+// A block of the host allocator for capacity characters; throws std::bad_alloc like the standard
+// strings. The block is released from its characters (String::release).
 wchar_t* allocateBlock(std::size_t capacity) {
   if (capacity > 0x7fffffffU) throw std::bad_alloc();
   const std::size_t bytes = 2 * sizeof(std::uint32_t) + (capacity + 1) * sizeof(wchar_t);
-  auto* block = static_cast<std::uint32_t*>(std::malloc(bytes));
+  auto* block = static_cast<std::uint32_t*>(vyn_operator_new(bytes));
   if (block == nullptr) throw std::bad_alloc();
   block[0] = 0;
   block[1] = static_cast<std::uint32_t>(capacity);
@@ -161,10 +159,9 @@ std::size_t String::length() const noexcept {
   return chars_ == nullptr ? 0 : header()->length;
 }
 void String::release() noexcept {
-  if (chars_ != nullptr && header()->capacity > 0) std::free(header());
+  if (chars_ != nullptr && header()->capacity > 0) vyn_operator_delete(header());
   chars_ = nullptr;
 }
-// NOLINTEND(clang-analyzer-unix.Malloc)
 void String::setLength(std::size_t newLength) noexcept {
   if (chars_ == nullptr) return;
   header()->length = static_cast<std::uint32_t>(newLength);
