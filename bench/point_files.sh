@@ -27,14 +27,22 @@ cmake --build "$build" -j"$jobs" --target dexchange_bench_PointFilesBench dexcha
 bench=$build/bench/dexchange_bench_PointFilesBench
 tool=$build/tools/dexchange/dexchange
 
-# Runs one benchmark in a process of its own, prints its row and keeps its CPU milliseconds and peak.
+# First touches of fresh memory cost what the machine's other load and its hypervisor make them cost,
+# so each figure is the median of RUNS runs (default 3).
+runs=${RUNS:-3}
+median() { sort -n -k"$1" | sed -n "$(((runs + 1) / 2))p"; }
+
+# Runs one benchmark RUNS times, each in a process of its own, prints the median row (by CPU time) and
+# keeps its CPU milliseconds and peak MB.
 declare -A cpu_ms peak_mb
 run() {
   local name=$1 key=$2
   shift 2
   local row
-  row=$(env "$@" "$bench" --benchmark_filter="^$name/" --benchmark_counters_tabular=true 2>/dev/null |
-    grep -E "^$name/")
+  row=$(for ((i = 0; i < runs; ++i)); do
+    env "$@" "$bench" --benchmark_filter="^$name/" --benchmark_counters_tabular=true 2>/dev/null |
+      grep -E "^$name/"
+  done | median 4)
   echo "$row"
   cpu_ms[$key]=$(awk '{print $4}' <<<"$row")
   peak_mb[$key]=$(awk '{print $8}' <<<"$row")
@@ -51,11 +59,14 @@ for name in ModelBlocks LoaderImport LoaderImportJobs; do
   run "$name" "$name.malloc" DEXCHANGE_ALLOCATOR=malloc
 done
 
-# wall and CPU (user + system) seconds and peak MB of a command
+# wall and CPU (user + system) seconds and peak MB of a command: the median of RUNS runs by CPU time
 measure() {
-  /usr/bin/time -f "%e %U %S %M" -o "$work/time" "$@" >/dev/null 2>&1 || { echo "failed"; return; }
-  read -r seconds user system kilobytes <"$work/time"
-  echo "$seconds s wall, $(echo "$user + $system" | bc) s CPU, $((kilobytes / 1024)) MB peak"
+  local i
+  for ((i = 0; i < runs; ++i)); do
+    /usr/bin/time -f "%e %U %S %M" -o "$work/time" "$@" >/dev/null 2>&1 || { echo "failed"; return; }
+    read -r seconds user system kilobytes <"$work/time"
+    echo "$seconds s wall, $(echo "$user + $system" | bc) s CPU, $((kilobytes / 1024)) MB peak"
+  done | median 4
 }
 
 echo
@@ -71,9 +82,14 @@ cmake --install "$build" --prefix "$prefix" >/dev/null
 libdir=$(dirname "$(find "$prefix" -name libdexchange.so -print -quit)")
 read -r -a pc_flags <<<"$(PKG_CONFIG_PATH="$libdir/pkgconfig" pkg-config --cflags --libs dexchange)"
 c++ -O2 "$root/bench/host/ImportHost.cpp" -o "$work/import_host" "${pc_flags[@]}"
-echo "import in a worker thread:          $(LD_LIBRARY_PATH="$libdir" "$work/import_host" "$DEXCHANGE_BENCH_CSV")"
-echo "the same, malloc:                   $(DEXCHANGE_ALLOCATOR=malloc LD_LIBRARY_PATH="$libdir" \
-  "$work/import_host" "$DEXCHANGE_BENCH_CSV")"
+host() {
+  local i
+  for ((i = 0; i < runs; ++i)); do
+    env "$@" LD_LIBRARY_PATH="$libdir" "$work/import_host" "$DEXCHANGE_BENCH_CSV"
+  done | median 1
+}
+echo "import in a worker thread:          $(host)"
+echo "the same, malloc:                   $(host DEXCHANGE_ALLOCATOR=malloc)"
 
 echo
 echo "== ogr2ogr (gdal-bin)"

@@ -29,6 +29,16 @@ std::unique_ptr<DexFormat> csvForImport() {
       format.getParameters());
 }
 
+// A host learns of the end of a threaded run through its notifier (called in the worker thread).
+class FinishFlag : public IDexFinishNotifier {
+ public:
+  void onFinished(EDexResult result) override { result_ = result; }
+  IDexFinishNotifier* clone() const override { return new FinishFlag(*this); }
+
+ private:
+  EDexResult result_ = DEX_RESULT_OK;
+};
+
 double cpuSeconds() {
   rusage usage{};
   getrusage(RUSAGE_SELF, &usage);
@@ -55,6 +65,7 @@ int main(int argc, char** argv) {
   const auto format = csvForImport();
   DexSettings settings;
   settings.addDataType(POINTS);
+  settings.importNotifier = new FinishFlag;
   DexParsersLoader loader;
   loader.initIEData(settings);
 

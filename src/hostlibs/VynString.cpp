@@ -577,8 +577,19 @@ std::string toUtf8(std::wstring_view text) {
   return detail::toUtf8(text);
 }
 void appendUtf8(std::string& out, std::wstring_view text) {
-  for (const wchar_t ch : text)
-    detail::appendUtf8(out, ch);
+  // The texts of survey files are mostly ASCII: its runs are copied, not encoded one by one.
+  const auto isAscii = [](wchar_t ch) { return ch >= 0 && ch < 0x80; };
+  auto next = text.begin();
+  while (next != text.end()) {
+    const auto asciiEnd = std::find_if_not(next, text.end(), isAscii);
+    const std::size_t start = out.size();
+    out.resize(start + static_cast<std::size_t>(asciiEnd - next));
+    std::transform(next, asciiEnd, out.begin() + static_cast<std::ptrdiff_t>(start),
+                   [](wchar_t ch) { return static_cast<char>(ch); });
+    if (asciiEnd == text.end()) break;
+    detail::appendUtf8(out, *asciiEnd);
+    next = asciiEnd + 1;
+  }
 }
 
 }  // namespace vyn_text
