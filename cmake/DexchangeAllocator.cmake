@@ -14,8 +14,12 @@ if(dexchange_allocator STREQUAL "mimalloc")
       "or configure with -DDEXCHANGE_ALLOCATOR=malloc")
   endif()
   # Linked by its path: hosts link libdexchange.so alone, so the exported package names no target.
+  # Debian's libmimalloc.so also defines malloc and operator new, and the library calls only its mi_
+  # functions. malloc always resolves to the C library, which every program depends on; the C++
+  # runtime comes before mimalloc in the library's dependencies, so that operator new resolves to it
+  # even in a program that loads the library with dlopen and does not depend on the C++ runtime.
   target_include_directories(dexchange SYSTEM PRIVATE "${MIMALLOC_INCLUDE_DIR}")
-  target_link_libraries(dexchange PRIVATE "${MIMALLOC_LIBRARY}")
+  target_link_libraries(dexchange PRIVATE stdc++ "${MIMALLOC_LIBRARY}")
   target_compile_definitions(dexchange PRIVATE DEXCHANGE_WITH_MIMALLOC=1)
 elseif(NOT dexchange_allocator STREQUAL "malloc")
   message(FATAL_ERROR "DEXCHANGE_ALLOCATOR must be mimalloc or malloc, not '${dexchange_allocator}'")

@@ -12,6 +12,7 @@
 #include <string>
 #include <string_view>
 #include <thread>
+#include <utility>
 #include <vector>
 
 #include "hostlibs/VynString.h"
@@ -233,15 +234,26 @@ TEST(VynAlloc, MemoryFreedByTheHostServesTheNextWorkers) {
       << "one job: " << kJobMegabytes << " MB; after the first job: " << afterFirstJob << " MB";
 }
 
-// The library's allocator is its own: the process's malloc and operator new stay where they were.
+// The library's allocator is its own: malloc and operator new stay the runtimes' for the process,
+// and operator new also inside the library's own dependencies, where a program that loads the library
+// with dlopen and has no C++ runtime of its own finds it.
 TEST(VynAlloc, TheProcessKeepsItsOwnMalloc) {
   EXPECT_TRUE(std::string_view(vyn_operator_allocator()) == "mimalloc" ||
               std::string_view(vyn_operator_allocator()) == "malloc");
-  for (const char* symbol : {"malloc", "free", "_Znwm"}) {
-    Dl_info info{};
-    ASSERT_NE(dladdr(dlsym(RTLD_DEFAULT, symbol), &info), 0) << symbol;
-    EXPECT_EQ(std::string_view(info.dli_fname).find("mimalloc"), std::string_view::npos) << symbol;
+  Dl_info library{};
+  ASSERT_NE(dladdr(reinterpret_cast<void*>(&vyn_operator_new), &library), 0);
+  void* const libraryScope = dlopen(library.dli_fname, RTLD_NOW | RTLD_NOLOAD);
+  ASSERT_NE(libraryScope, nullptr);
+  const std::pair<void*, std::vector<const char*>> lookups[] = {
+      {RTLD_DEFAULT, {"malloc", "free", "_Znwm", "_ZdlPv"}}, {libraryScope, {"_Znwm", "_ZdlPv", "_Znam"}}};
+  for (const auto& [scope, symbols] : lookups) {
+    for (const char* symbol : symbols) {
+      Dl_info info{};
+      ASSERT_NE(dladdr(dlsym(scope, symbol), &info), 0) << symbol;
+      EXPECT_EQ(std::string_view(info.dli_fname).find("mimalloc"), std::string_view::npos) << symbol;
+    }
   }
+  dlclose(libraryScope);
 }
 
 }  // namespace
