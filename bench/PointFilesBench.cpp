@@ -19,6 +19,7 @@
 #include <string_view>
 #include <vector>
 
+#include "host/PointFileRun.h"
 #include "hostlibs/VynAlloc.h"
 #include "hostlibs/VynThread.h"
 #include "ieDefinitions/IEFormatsData.h"
@@ -32,9 +33,10 @@
 namespace {
 
 using namespace vyn::ie;
+using dexchange_bench::csvBothWays;
+using dexchange_bench::peakMegabytes;
 
 constexpr int kPointCount = 1000000;
-constexpr const wchar_t* kCsvId = L"{A9A6A37F-F823-4509-9B41-3AC02B45CAA2}";
 
 std::string benchFile() {
   const char* given = std::getenv("DEXCHANGE_BENCH_CSV");
@@ -68,16 +70,6 @@ const std::string& surveyFile() {
     return file;
   }();
   return path;
-}
-
-// Peak resident memory of the process so far, in MB.
-double peakMegabytes() {
-  std::ifstream status("/proc/self/status");
-  std::string line;
-  while (std::getline(status, line)) {
-    if (line.rfind("VmHWM:", 0) == 0) return std::stod(line.substr(6)) / 1024.0;
-  }
-  return 0.0;
 }
 
 struct BarePoint {
@@ -129,15 +121,6 @@ std::vector<BarePoint> bareParse(const std::string& path, bool keep) {
   std::fclose(file);
   benchmark::DoNotOptimize(count);
   return points;
-}
-
-std::unique_ptr<DexFormat> csvBothWays() {
-  const DexFormat& format = *getIEFormatsData().getFormatById(kCsvId);
-  return std::make_unique<DexFormat>(
-      format.getGuid(), format.getName(), DexFormat::IMPORT_AND_EXPORT, L"ExportParsers", L"ImportParsers",
-      format.getTitle(), format.getExtension(false), format.getFilterExtension(), format.getConfigurations(),
-      format.getUsingModes(), format.getDataTypes(), format.getDistanceUnits(), format.getAngleUnits(),
-      format.getParameters());
 }
 
 CVynStringT<wchar_t> wide(const std::string& path) {

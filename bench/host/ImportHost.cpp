@@ -7,27 +7,13 @@
 #include <sys/resource.h>
 
 #include <cstdio>
-#include <fstream>
-#include <memory>
-#include <string>
 
+#include "PointFileRun.h"
 #include "dexchange.h"
 
 namespace {
 
 using namespace vyn::ie;
-
-constexpr const wchar_t* kCsvId = L"{A9A6A37F-F823-4509-9B41-3AC02B45CAA2}";
-
-// The registry lists CSV for export only; the shipped import library reads it too.
-std::unique_ptr<DexFormat> csvForImport() {
-  const DexFormat& format = *getIEFormatsData().getFormatById(kCsvId);
-  return std::make_unique<DexFormat>(
-      format.getGuid(), format.getName(), DexFormat::IMPORT_AND_EXPORT, L"ExportParsers", L"ImportParsers",
-      format.getTitle(), format.getExtension(false), format.getFilterExtension(), format.getConfigurations(),
-      format.getUsingModes(), format.getDataTypes(), format.getDistanceUnits(), format.getAngleUnits(),
-      format.getParameters());
-}
 
 // A host learns of the end of a threaded run through its notifier (called in the worker thread).
 class FinishFlag : public IDexFinishNotifier {
@@ -46,15 +32,6 @@ double cpuSeconds() {
          static_cast<double>(usage.ru_utime.tv_usec + usage.ru_stime.tv_usec) / 1e6;
 }
 
-double peakMegabytes() {
-  std::ifstream status("/proc/self/status");
-  std::string line;
-  while (std::getline(status, line)) {
-    if (line.rfind("VmHWM:", 0) == 0) return std::stod(line.substr(6)) / 1024.0;
-  }
-  return 0.0;
-}
-
 }  // namespace
 
 int main(int argc, char** argv) {
@@ -62,7 +39,7 @@ int main(int argc, char** argv) {
     std::fprintf(stderr, "usage: import_host FILE.csv\n");
     return 2;
   }
-  const auto format = csvForImport();
+  const auto format = dexchange_bench::csvBothWays();
   DexSettings settings;
   settings.addDataType(POINTS);
   settings.importNotifier = new FinishFlag;
@@ -82,7 +59,7 @@ int main(int argc, char** argv) {
     std::fprintf(stderr, "import_host: the import failed (%d)\n", static_cast<int>(result));
     return 1;
   }
-  std::printf("%.2f s CPU, %.0f MB peak, %d points, %s\n", seconds, peakMegabytes(),
+  std::printf("%.2f s CPU, %.0f MB peak, %d points, %s\n", seconds, dexchange_bench::peakMegabytes(),
               loader.getIEData()->getCurDataset()->getNumberOfElements(OBJECT_TYPE_ALL, 2),
               vyn_operator_allocator());
   return 0;

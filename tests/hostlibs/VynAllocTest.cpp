@@ -167,6 +167,7 @@ TEST(VynAlloc, ThreadsReleaseWhatOtherThreadsMade) {
     }
   };
   std::vector<std::thread> threads;
+  threads.reserve(kThreads);
   for (int thread = 0; thread < kThreads; ++thread) {
     threads.emplace_back([&, thread] {
       const int next = (thread + 1) % kThreads;
