@@ -2,7 +2,8 @@
 # Installs the Debian packages the build needs when they are missing; a no-op when all are present.
 set -euo pipefail
 
-packages=(cmake g++ make pkg-config libxml2-dev googletest libgtest-dev libgmock-dev libbenchmark-dev libmimalloc-dev locales)
+packages=(cmake g++ make pkg-config libxml2-dev googletest libgtest-dev libgmock-dev libbenchmark-dev locales)
+packages+=(libmimalloc-dev)  # the allocator of the model's blocks (src/hostlibs/VynAlloc.cpp)
 if [[ "${DEXCHANGE_FUZZ:-}" == "ON" ]]; then
   packages+=(clang libclang-rt-dev)
 fi
