@@ -2,8 +2,11 @@
 # Installs the Debian packages the build needs when they are missing; a no-op when all are present.
 set -euo pipefail
 
-packages=(cmake g++ make pkg-config libxml2-dev googletest libgtest-dev libgmock-dev libbenchmark-dev locales)
+packages=(cmake g++ make pkg-config libxml2-dev googletest libgtest-dev libgmock-dev libbenchmark-dev locales
+  python3)  # the tool tests read its JSON reports with Python's json module
 packages+=(libmimalloc-dev)  # the allocator of the model's blocks (src/hostlibs/VynAlloc.cpp)
+# The independent DXF readers and writers the DXF tests compare against (/usr/bin/python3 sees python3-ezdxf).
+packages+=(python3-ezdxf gdal-bin)
 if [[ "${DEXCHANGE_FUZZ:-}" == "ON" ]]; then
   packages+=(clang libclang-rt-dev)
 fi

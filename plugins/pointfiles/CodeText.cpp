@@ -55,7 +55,8 @@ void appendCodesText(const DexCodesDataInterface& codes, bool withStrings, bool 
   }
 }
 
-bool CodeReader::read(std::wstring_view text, DexCodesDataInterface& target) {
+bool CodeReader::read(std::wstring_view text, DexCodesDataInterface& target, std::wstring& rejected) {
+  bool wellFormed = true;
   std::size_t position = 0;
   while (position < text.size()) {
     while (position < text.size() && isBlank(text[position]))
@@ -63,42 +64,62 @@ bool CodeReader::read(std::wstring_view text, DexCodesDataInterface& target) {
     std::size_t end = position;
     while (end < text.size() && !isBlank(text[end]))
       ++end;
-    if (end > position && !readOne(text.substr(position, end - position), target)) return false;
+    const std::wstring_view item = text.substr(position, end - position);
+    if (!item.empty() && !readOne(item, target)) {
+      if (!rejected.empty()) rejected += L' ';
+      rejected += item;
+      wellFormed = false;
+    }
     position = end;
   }
-  return true;
+  return wellFormed;
 }
+
+namespace {
+
+// The parts after the first mark of a text, each up to the next mark (the first part is empty when
+// the text does not start with the mark).
+template <class Visit>
+void forEachPart(std::wstring_view text, wchar_t mark, Visit visit) {
+  std::size_t position = text.find(mark);
+  while (position < text.size()) {
+    const std::size_t next = std::min(text.find(mark, position + 1), text.size());
+    visit(text.substr(position + 1, next - position - 1));
+    position = next;
+  }
+}
+
+bool isAttributeWellFormed(std::wstring_view attribute) {
+  const std::size_t equals = attribute.find(kValueMark);
+  return attribute.empty() || (equals != std::wstring_view::npos && equals > 0);
+}
+
+}  // namespace
 
 bool CodeReader::readOne(std::wstring_view item, DexCodesDataInterface& target) {
   const std::size_t attributesAt = std::min(item.find(kAttributeMark), item.size());
   const std::wstring_view head = item.substr(0, attributesAt);
-  const std::size_t stringsAt = std::min(head.find(kStringMark), head.size());
-  const std::wstring_view name = head.substr(0, stringsAt);
-  if (name.empty()) return false;
-  const DexCodeDescription* codeDescription = description(name);
+  const std::wstring_view attributes = item.substr(attributesAt);
+  const std::wstring_view name = head.substr(0, std::min(head.find(kStringMark), head.size()));
+  bool wellFormed = !name.empty();
+  forEachPart(attributes, kAttributeMark,
+              [&wellFormed](std::wstring_view attribute) { wellFormed &= isAttributeWellFormed(attribute); });
+  const DexCodeDescription* codeDescription = wellFormed ? description(name) : nullptr;
   if (codeDescription == nullptr) return false;
 
   auto* code = new DexCodeValues(codeDescription);
   target.addCode(code);
-  std::size_t position = stringsAt;
-  while (position < head.size()) {
-    const std::size_t next = std::min(head.find(kStringMark, position + 1), head.size());
-    assignText(first_, head.substr(position + 1, next - position - 1));
+  forEachPart(head, kStringMark, [this, code](std::wstring_view string) {
+    assignText(first_, string);
     code->addCodeString(first_);
-    position = next;
-  }
-  position = attributesAt;
-  while (position < item.size()) {
-    const std::size_t next = std::min(item.find(kAttributeMark, position + 1), item.size());
-    const std::wstring_view attribute = item.substr(position + 1, next - position - 1);
-    position = next;
-    if (attribute.empty()) continue;
+  });
+  forEachPart(attributes, kAttributeMark, [this, code](std::wstring_view attribute) {
+    if (attribute.empty()) return;
     const std::size_t equals = attribute.find(kValueMark);
-    if (equals == std::wstring_view::npos || equals == 0) return false;
     assignText(first_, attribute.substr(0, equals));
     assignText(second_, attribute.substr(equals + 1));
     code->insertAttr(first_, second_);
-  }
+  });
   return true;
 }
 

@@ -37,9 +37,10 @@ class CodeReader {
  public:
   explicit CodeReader(DexData* data) : data_(data) {}
 
-  // Adds to target one code value per code of text. False when text holds a malformed code (an
-  // empty code name, or an attribute without "="); the codes read before it stay.
-  bool read(std::wstring_view text, DexCodesDataInterface& target);
+  // Adds to target one code value per code of text. A malformed code (an empty code name, or an
+  // attribute without a name or without "=") is not added: its text is appended to rejected (blank
+  // separated), and the answer is false; the other codes are read all the same.
+  bool read(std::wstring_view text, DexCodesDataInterface& target, std::wstring& rejected);
 
  private:
   // The library's description of that code, added when missing; null only without data.

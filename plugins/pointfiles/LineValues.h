@@ -17,19 +17,24 @@ namespace vyn::ie::point_files {
 
 // Splits lines by a layout. Delimited lines: values are trimmed of blanks and tabs; a value in
 // double quotes may hold the delimiter and writes a quote as two; with the blank as delimiter a run
-// of blanks separates two values. Fixed-width lines go through parseValuesByFixFmt.
+// of blanks and tabs separates two values. Fixed-width lines go through parseValuesByFixFmt; what
+// stands after the last column is one more value (when it is not blank).
 class LineSplitter {
  public:
   explicit LineSplitter(const PointLayout& layout);
 
   // The values of line; they stay valid until the next call.
   const std::vector<std::wstring_view>& split(const CVynStringT<wchar_t>& line);
+  // The same with another delimiter (for trying delimiters on the first lines).
+  const std::vector<std::wstring_view>& split(std::wstring_view line, wchar_t delimiter);
 
  private:
-  void splitDelimited(std::wstring_view line);
+  void splitDelimited(std::wstring_view line, wchar_t delimiter);
   void splitFixed(const CVynStringT<wchar_t>& line);
+  const std::vector<std::wstring_view>& values();
 
   const PointLayout& layout_;
+  std::size_t fixedLength_ = 0;  // the widths of the fixed columns together
   const DexUserAsciiSettingsData fixedLayout_;
   CVynArray<CVynStringT<wchar_t>, const CVynStringT<wchar_t>&> fixedValues_;
   std::wstring text_;                                       // the values one after another
@@ -38,8 +43,9 @@ class LineSplitter {
 };
 
 // Reads the whole text as a decimal number ("12.5", "-3", "+1e3"), independently of the locale.
+// With decimalComma, one comma stands for the decimal point in a text without one ("12,5").
 // False for an empty text, for anything else after the number, and for infinities and NaN.
-bool parseNumber(std::wstring_view text, double& value);
+bool parseNumber(std::wstring_view text, double& value, bool decimalComma = false);
 
 // True when text is blank (blanks, tabs and line ends only).
 bool isBlankText(std::wstring_view text);

@@ -58,7 +58,7 @@ bool PointFileExporter::singleStep() {
 }
 
 bool PointFileExporter::open() {
-  if (data == nullptr || !makeLayout(format, data->getSettings(), layout_)) return false;
+  if (data == nullptr || !makeLayout(format, data->getSettings(), false, layout_)) return false;
   const DexSettings& settings = data->getSettings();
   if (!utils::isExportFileWithSameName(fileName, settings.messageBox, settings.parentWindow)) return false;
   file_ = std::fopen(vyn_text::toUtf8(fileName.view()).c_str(), "wb");
@@ -146,7 +146,7 @@ void PointFileExporter::writePoint(const DexDesignPoint& point) {
                     point.getLayer() != nullptr ? point.getLayer()->getName().view() : std::wstring_view(),
                     true);
         break;
-      case EColumn::IGNORED:
+      case EColumn::OTHER:
         appendValue(column, std::wstring_view(), false);
         break;
     }

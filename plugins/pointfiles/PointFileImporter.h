@@ -11,13 +11,17 @@ namespace vyn::ie::point_files {
 // meters), heights, notes and codes (descriptions added to the code library). Reads points only when
 // the settings request POINTS or POINT_LISTS.
 //
-// Blank lines are passed over; a first line that names the columns (or any first line when the
-// layout says it has a header) is skipped. A malformed line (no name where the layout has a name, a
-// coordinate that is missing or not a number, a malformed code, a non-empty value beyond the last
-// column) is skipped and traced. Results: DEX_RESULT_OK; kResultLinesSkipped when lines were skipped
-// and at least one point was read; DEX_RESULT_WRONG_FORMAT when no line gave a point;
-// DEX_RESULT_FILE_ERROR when the file cannot be opened; DEX_RESULT_STOPPED when DexData::stopProcess_
-// was set (the points read so far stay). The importer publishes how much of the file it has read.
+// The first lines decide the layout (findLayout): the delimiter when the settings leave it to the
+// file, the columns when a header line names them; points of a layout without a name column are
+// numbered. Blank lines and the header line are passed over. Nothing read well is lost: a value the
+// point has no column for (after the last column, in a column the header names but no field matches,
+// a height that is no number, a malformed code) is kept in the point's notes, "label=value" joined by
+// "; " after the Notes column; only a line without a name or without coordinates is dropped. The run
+// ends with notes (trace records, ImportNotes.h) on the layout and on the lines dropped or kept.
+// Results: DEX_RESULT_OK; kResultLinesSkipped when lines were dropped and at least one point was
+// read; DEX_RESULT_WRONG_FORMAT when lines were dropped and none gave a point; DEX_RESULT_FILE_ERROR
+// when the file cannot be opened; DEX_RESULT_STOPPED when DexData::stopProcess_ was set (the points
+// read so far stay). The importer publishes how much of the file it has read.
 class PointFileImporter final : public DexImporterImpl {
  public:
   VYN_CLASS_ALLOCATOR

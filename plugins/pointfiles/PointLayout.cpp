@@ -43,7 +43,7 @@ EColumn columnOf(EType type) {
     case FIELD_LAYER_NAME:
       return EColumn::LAYER;
     default:
-      return EColumn::IGNORED;
+      return EColumn::OTHER;
   }
 }
 
@@ -54,6 +54,11 @@ int PointLayout::findColumn(EColumn column) const {
   return -1;
 }
 
+std::wstring PointLayout::label(std::size_t column) const {
+  if (column < labels.size() && !labels[column].empty()) return labels[column];
+  return column < fields.size() ? std::wstring(typeToField(fields[column].type).view()) : std::wstring();
+}
+
 namespace {
 
 void setCsvColumns(PointLayout& layout) {
@@ -62,34 +67,41 @@ void setCsvColumns(PointLayout& layout) {
                    {FIELD_EASTING, 0, 0},
                    {FIELD_HEIGHT, 0, 0},
                    {FIELD_FULL_CODES, 0, 0}};
-  layout.delimiter = L',';
   layout.fixedWidth = false;
   layout.headerLine = false;
   layout.quoteAlways = false;
+  layout.columnsFrom = ESource::ASSUMED;
 }
 
 // The point fields of the user's layout; false when it has none.
-bool setCustomColumns(const DexUserAsciiSettingsData* ascii, PointLayout& layout) {
-  if (ascii == nullptr) return false;
+bool setCustomColumns(const DexUserAsciiSettingsData& ascii, PointLayout& layout) {
   layout.fields.clear();
-  for (const DexFieldFormat& field : ascii->fields) {
+  for (const DexFieldFormat& field : ascii.fields) {
     if (isFieldHasOwner(field.type, OWNER_POINTS)) layout.fields.push_back(field);
   }
   if (layout.fields.empty()) return false;
-  layout.delimiter = ascii->delimiter == L'\0' ? L',' : ascii->delimiter;
   layout.fixedWidth = std::any_of(layout.fields.begin(), layout.fields.end(),
                                   [](const DexFieldFormat& field) { return field.width > 0; });
-  layout.headerLine = ascii->headerLine;
-  layout.quoteAlways = ascii->quotedValues && !layout.fixedWidth;
+  layout.headerLine = ascii.headerLine;
+  layout.quoteAlways = ascii.quotedValues && !layout.fixedWidth;
+  layout.columnsFrom = ESource::GIVEN;
   return true;
 }
 
 }  // namespace
 
-bool makeLayout(const DexFormat* format, const DexSettings& settings, PointLayout& layout) {
+bool makeLayout(const DexFormat* format, const DexSettings& settings, bool forImport, PointLayout& layout) {
   if (!isPointFileFormat(format)) return false;
-  if (format->isIdEqual(kCsvFormatId) || !setCustomColumns(settings.userAsciiSettings, layout))
-    setCsvColumns(layout);
+  layout = PointLayout();
+  const DexUserAsciiSettingsData* ascii = settings.userAsciiSettings;
+  const bool csv = format->isIdEqual(kCsvFormatId);
+  const bool customColumns = ascii != nullptr && (forImport || !csv) && setCustomColumns(*ascii, layout);
+  if (!customColumns) setCsvColumns(layout);
+  // A CSV file is delimited whatever widths the custom layout gives.
+  if (csv) layout.fixedWidth = layout.headerLine = false;
+  const bool delimiterGiven = ascii != nullptr && !csv && ascii->delimiter != kDelimiterToFind;
+  if (delimiterGiven) layout.delimiter = ascii->delimiter;
+  layout.delimiterFrom = delimiterGiven || !forImport ? ESource::GIVEN : ESource::FOUND;
   layout.units = settings.distUnits;
   for (std::size_t i = 0; i < layout.decimals.size(); ++i)
     layout.decimals[i] = std::clamp(settings.coordDecimals[i], 0, 12);

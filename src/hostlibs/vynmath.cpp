@@ -9,11 +9,14 @@
 #include <string_view>
 
 #include "hostlibs/detail/DecimalText.h"
+#include "hostlibs/detail/SinCosDegrees.h"
 
 namespace {
 
 using vyn_formats::detail::parseDecimal;
 using vyn_formats::detail::shortestFixed;
+using vyn_math::detail::SinCos;
+using vyn_math::detail::sinCosDegrees;
 
 constexpr double kDegreesPerTurn = 360.0;
 constexpr double kGradsPerTurn = 400.0;
@@ -116,28 +119,6 @@ double twoDigitField(const std::string& fraction, std::size_t first, bool withDe
   double value = 0.0;
   parseDecimal(field, value);
   return value;
-}
-
-struct SinCos {
-  double sin = 0.0;
-  double cos = 1.0;
-};
-
-// Sine and cosine of an angle in [0, 360), exact at the multiples of 90 degrees.
-SinCos sinCosDegrees(double degrees) {
-  const int quadrant = std::clamp(static_cast<int>(degrees / 90.0), 0, 3);
-  const double rest = Deg2Rad(degrees - 90.0 * quadrant);
-  const SinCos inQuadrant = rest == 0.0 ? SinCos{} : SinCos{std::sin(rest), std::cos(rest)};
-  switch (quadrant) {
-    case 1:
-      return {inQuadrant.cos, -inQuadrant.sin};
-    case 2:
-      return {-inQuadrant.sin, -inQuadrant.cos};
-    case 3:
-      return {-inQuadrant.cos, inQuadrant.sin};
-    default:
-      return inQuadrant;
-  }
 }
 
 }  // namespace

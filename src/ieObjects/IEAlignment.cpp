@@ -1,5 +1,6 @@
 #include "ieObjects/IEAlignment.h"
 
+#include <algorithm>
 #include <cmath>
 #include <cstddef>
 
@@ -18,6 +19,12 @@ void setOptionalOffset(double offset, double& value, bool& present) noexcept {
 
 bool isPartType(int type) noexcept {
   return type >= 0 && type < IDexAlignmentPart::kNumberOfPartTypes;
+}
+
+// Whether the road-string set names part in one of its pairs. The model has no road-string set class
+// yet, so no set can name a part; the road strings answer this once they exist.
+bool isNamedByRoadStringSet(const IDexAlignmentPart& /*roadStringSet*/, const IDexAlignmentPart& /*part*/) {
+  return false;
 }
 
 }  // namespace
@@ -56,6 +63,19 @@ IDexAlignmentPart* DexAlignment::getAlignmentPart(int type) const {
     return nullptr;
   }
   return primaryParts_[static_cast<std::size_t>(type)];
+}
+
+bool DexAlignment::isAlignPartIncluded(const IDexAlignmentPart* part, bool deep) const {
+  if (part == nullptr) return false;
+  return std::any_of(parts_.begin(), parts_.end(), [part, deep](const IDexAlignmentPart* entry) {
+    return entry == part || (deep && entry->getType() == IDexAlignmentPart::ROAD_STRING_SET &&
+                             isNamedByRoadStringSet(*entry, *part));
+  });
+}
+
+IDexAlignmentPart* DexAlignment::getAlignmentPartAt(int index) const noexcept {
+  return index >= 0 && index < getNumberOfAlignmentParts() ? parts_[static_cast<std::size_t>(index)]
+                                                           : nullptr;
 }
 
 bool DexAlignment::getStnInterval(double& interval) const {

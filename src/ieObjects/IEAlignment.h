@@ -11,6 +11,8 @@
 #include "ieObjects/IEHorizontalAlignment.h"
 #include "ieObjects/IEInterfaces.h"
 #include "ieObjects/IEOwnedPointer.h"
+#include "ieObjects/IEStationEquations.h"
+#include "ieObjects/IEVerticalAlignment.h"
 
 // Alignments of a dataset: named roads made of parts.
 //
@@ -77,6 +79,14 @@ class DEX_API DexAlignment : public IDexObjInterface,
   // The primary part of type (an IDexAlignmentPart::EDexAlignmentPartType value or its number), or null
   // when there is none. A type outside 0 to 3 answers null after an error-log record (line 742).
   IDexAlignmentPart* getAlignmentPart(int type) const;
+  // Whether part is among the alignment's parts (the same object). With deep, also whether one of its
+  // road-string sets names part in one of its pairs (by kind and name). False for null.
+  bool isAlignPartIncluded(const IDexAlignmentPart* part, bool deep) const;
+  // Every part given to the alignment, in the order given, primary parts included (a part given twice
+  // is listed twice).
+  int getNumberOfAlignmentParts() const noexcept { return static_cast<int>(parts_.size()); }
+  // The part at index in that list, or null for an index outside it.
+  IDexAlignmentPart* getAlignmentPartAt(int index) const noexcept;
 
   // ---- Further properties ---------------------------------------------------------------------
   // False, with interval unchanged, while no interval above 0 is set; otherwise the interval and true.

@@ -5,14 +5,13 @@
 
 #include "hostlibs/VynLogging.h"
 #include "ieObjects/IEPoints.h"
+#include "ieObjects/detail/AlignmentPartsLog.h"
 
 namespace vyn::ie {
 
 namespace {
 
-constexpr const wchar_t* kAlignmentPartsLogSource = L"ieObjects\\IEAlignmentPartsDictionary";
-constexpr int kNullPartLine = 801;
-constexpr int kUnknownPartKindLine = 802;
+using detail::kAlignmentPartsLogSource;
 
 bool isKnownKind(int kind) {
   return kind >= 0 && kind < IDexAlignmentPart::kNumberOfPartTypes;
@@ -30,7 +29,7 @@ DexAlignmentPartsDictionary::PartList* DexAlignmentPartsDictionary::listOf(int k
 
 const DexAlignmentPartsDictionary::PartList* DexAlignmentPartsDictionary::listOf(int kind) const {
   if (!isKnownKind(kind)) {
-    vyn_logging::vyn_err_log(kAlignmentPartsLogSource, kUnknownPartKindLine);
+    vyn_logging::vyn_err_log(kAlignmentPartsLogSource, detail::kPartsUnknownKindLine);
     return nullptr;
   }
   return &parts_[static_cast<std::size_t>(kind)];
@@ -38,7 +37,7 @@ const DexAlignmentPartsDictionary::PartList* DexAlignmentPartsDictionary::listOf
 
 bool DexAlignmentPartsDictionary::addAlignmentPart(IDexAlignmentPart* part) {
   if (part == nullptr) {
-    vyn_logging::vyn_err_log(kAlignmentPartsLogSource, kNullPartLine);
+    vyn_logging::vyn_err_log(kAlignmentPartsLogSource, detail::kPartsNullPartLine);
     return false;
   }
   PartList* const list = listOf(part->getType());

@@ -191,11 +191,8 @@ const DexGpsBaseStation* DexDataset::findRawPoint(const CVynStringT<wchar_t>& na
 const IDexRawDataInterface* DexDataset::findRawPointRecord(const CVynStringT<wchar_t>& name) const {
   const DexRawData* const rawData = rawData_.get();
   if (rawData == nullptr) return nullptr;
-  for (int i = 0; i < rawData->getNumberOfRawData(); ++i) {
-    const IDexRawDataInterface* const record = rawData->getRawDataAt(i);
-    if (isRawPointKind(record->getRawDataType()) && record->getName() == name) return record;
-  }
-  return nullptr;
+  return rawData->getRawDataAt(rawData->findFirstIndex(
+      name, [](const IDexRawDataInterface& record) { return isRawPointKind(record.getRawDataType()); }));
 }
 
 // ---- Removing and resetting ---------------------------------------------------------------------

@@ -52,6 +52,8 @@ class DexOwnedPointer {
   void reset(T* object = nullptr) noexcept {
     if (object != object_.get()) object_.reset(object);
   }
+  // Gives up the held object without deleting it: the caller owns the result (null when empty).
+  T* release() noexcept { return object_.release(); }
 
  private:
   static T* copyOf(const T* object) { return object != nullptr ? CopyPolicy::copy(*object) : nullptr; }

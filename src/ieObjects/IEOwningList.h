@@ -1,5 +1,6 @@
 #pragma once
 
+#include <algorithm>
 #include <cstddef>
 #include <iterator>
 #include <memory>
@@ -168,6 +169,16 @@ class DexOwningList {
   }
   // Deletes every item.
   void clear() noexcept { items_.clear(); }
+
+  // Reordering. Sorts the items by less(const T&, const T&), a strict weak order; equal items may
+  // change places.
+  template <class Less>
+  void sort(Less less) {
+    std::sort(items_.begin(), items_.end(),
+              [&less](const std::unique_ptr<T>& a, const std::unique_ptr<T>& b) {
+                return less(static_cast<const T&>(*a), static_cast<const T&>(*b));
+              });
+  }
 
   // Iteration over the item pointers, in list order.
   iterator begin() noexcept { return iterator(items_.begin()); }

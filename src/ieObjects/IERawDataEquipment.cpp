@@ -4,4 +4,6 @@ namespace vyn::ie {
 
 DexRawDataEquipment::~DexRawDataEquipment() = default;
 
+IDexEquipment::~IDexEquipment() = default;
+
 }  // namespace vyn::ie

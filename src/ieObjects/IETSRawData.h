@@ -1,21 +1,20 @@
 #pragma once
 
+#include <array>
 #include <cstdint>
 
 #include "hostlibs/DexApi.h"
 #include "hostlibs/VynAlloc.h"
 #include "hostlibs/VynString.h"
 #include "hostlibs/VynTime.h"
+#include "ieObjects/IEInterfaces.h"
 #include "ieObjects/IEOwnedPointer.h"
 #include "ieObjects/IERawData.h"
 #include "ieObjects/IETypedValues.h"
 
-// Total-station raw records: the measured values of one record and the common base of every
-// total-station record (raw kind RAW_DATA_TOTAL_STATION).
-//
-// So far the base holds the name, time, target height, depth, measured and averaged values and name
-// source of a record; its weather, surveyor, session-pattern, empty-name and model-name operations, the
-// sight base and the eight record kinds are still to come.
+// Total-station raw records (raw kind RAW_DATA_TOTAL_STATION): the measured values of one record, the
+// weather, surveyor and session records a record may carry, the common base of every total-station
+// record and the base of the sights. The eight record kinds are in IETSRawRecords.h.
 namespace vyn::ie {
 
 // The kind of a total-station record, as IDexTSRawDataInterface::getType() answers it.
@@ -106,18 +105,51 @@ class DEX_API DexTSRawData {
   double prismConst_ = 0.0;
 };
 
+// The weather under which a record was measured. The plug-ins and the job history give the fields
+// their meaning; the library stores and copies them. A plain value.
+struct DEX_API DexWeatherInfo {
+  VYN_CLASS_ALLOCATOR
+
+  std::array<std::int32_t, 2> numbers{};
+  std::array<double, 3> values{};
+};
+
+// Who measured a record. The plug-ins give the fields their meaning. A plain value.
+struct DEX_API DexSurveyorInfo {
+  VYN_CLASS_ALLOCATOR
+
+  std::array<CVynStringT<wchar_t>, 2> leadingTexts;
+  std::int64_t value = 0;
+  std::array<CVynStringT<wchar_t>, 2> trailingTexts;
+};
+
+// The pattern of the measurement session a record belongs to. The plug-ins give the fields their
+// meaning. A plain value.
+struct DEX_API DexSessionPattern {
+  VYN_CLASS_ALLOCATOR
+
+  CVynStringT<wchar_t> text;
+  std::int64_t leadingValue = 0;
+  std::array<double, 4> values{};
+  std::array<std::int32_t, 4> numbers{};
+  std::int64_t trailingValue = 0;
+};
+
 // The common base of the total-station records: a name, a time stamp, the target height, a depth,
-// the measured values and the averaged values (each held in a record of its own, or absent) and where
-// the name comes from.
+// the measured values and the averaged values (each held in a record of its own, or absent), where
+// the name comes from, whether the name was left empty in the field, the instrument model, and
+// optional weather, surveyor and session records.
 //
-// Ownership: the record owns its two value records. Their setters copy the argument (the caller keeps
-// it); copy construction and assignment duplicate them.
+// Ownership: the record owns its value records and its weather, surveyor and session records. The
+// setters copy their argument (the caller keeps it); copy construction and assignment duplicate
+// every owned record.
 //
 // The virtual table after the destructor: setName, getName, getRawDataType, getType, clone,
 // setTargetHeight, getTargetHeight, setDepth, getDepth, setTSRawData, getTSRawData,
-// setAveragedTSRawData, getAveragedTSRawData, setNameSource, getNameSource (the plug-in ABI). Further
-// operations are added after getNameSource; the time operations, which belong to the time interface's
-// table, are declared last.
+// setAveragedTSRawData, getAveragedTSRawData, setNameSource, getNameSource, setWeatherInfo,
+// getWeatherInfo, setSurveyorInfo, getSurveyorInfo, setSessionPattern, getSessionPattern,
+// setIsEmptyName, getIsEmptyName, setModelName, getModelName (the plug-in ABI). The time operations
+// belong to the time interface's table.
 class DEX_API IDexTSRawDataInterface : public IDexRawDataInterface {
  public:
   // Where a record's name comes from: a number agreed between the plug-ins. The dataset's walk from
@@ -136,7 +168,8 @@ class DEX_API IDexTSRawDataInterface : public IDexRawDataInterface {
   ERawDataType getRawDataType() const override { return RAW_DATA_TOTAL_STATION; }
   // The kind of the record.
   virtual EDexTSRawDataType getType() const = 0;
-  // A new record of the same kind with this one's data; the caller owns it.
+  // A new record of the same kind with this one's data; the caller owns it. Null only when memory
+  // runs out.
   virtual IDexTSRawDataInterface* clone() const = 0;
   virtual void setTargetHeight(double height) { targetHeight_ = height; }
   virtual double getTargetHeight() const { return targetHeight_; }
@@ -152,18 +185,35 @@ class DEX_API IDexTSRawDataInterface : public IDexRawDataInterface {
   // An ENameSource value or its number.
   virtual void setNameSource(int nameSource) { nameSource_ = static_cast<ENameSource>(nameSource); }
   virtual ENameSource getNameSource() const { return nameSource_; }
+  // The weather, surveyor and session setters make the held record on first use and copy every field
+  // of the argument into it. The getters copy the held record into the argument and answer true, or
+  // answer false, leaving the argument alone, when none is held.
+  virtual void setWeatherInfo(const DexWeatherInfo& info);
+  virtual bool getWeatherInfo(DexWeatherInfo& info) const;
+  virtual void setSurveyorInfo(const DexSurveyorInfo& info);
+  virtual bool getSurveyorInfo(DexSurveyorInfo& info) const;
+  virtual void setSessionPattern(const DexSessionPattern& pattern);
+  virtual bool getSessionPattern(DexSessionPattern& pattern) const;
+  // Whether the point had no name in the field (the name was given afterwards).
+  virtual void setIsEmptyName(bool isEmpty) { isEmptyName_ = isEmpty; }
+  virtual bool getIsEmptyName() const { return isEmptyName_; }
+  // The model of the instrument.
+  virtual void setModelName(const CVynStringT<wchar_t>& name) { modelName_ = name; }
+  virtual const CVynStringT<wchar_t>& getModelName() const { return modelName_; }
 
   void setTime(const base::CTime& time) override { time_ = time; }
   const base::CTime& getTime() const override { return time_; }
 
  protected:
-  // Empty name and time, target height and depth 0, no values, name source 0.
+  // Empty name and time, target height and depth 0, no values, name source 0, no weather, surveyor
+  // or session record, a name that was given, no model name.
   IDexTSRawDataInterface();
   IDexTSRawDataInterface(const IDexTSRawDataInterface&) = default;
   IDexTSRawDataInterface& operator=(const IDexTSRawDataInterface&) = default;
 
   // Gives target, through its virtual setters, this record's target height, values, averaged values,
-  // name source, time and name (not its depth). A null target, or this record itself, does nothing.
+  // name source, time and name; not its depth, weather, surveyor, session, empty-name flag or model
+  // name. A null target, or this record itself, does nothing.
   void copyData(IDexTSRawDataInterface* target) const;
 
  private:
@@ -174,6 +224,52 @@ class DEX_API IDexTSRawDataInterface : public IDexRawDataInterface {
   ENameSource nameSource_ = NAME_SOURCE_DEFAULT;
   base::CTime time_;
   CVynStringT<wchar_t> name_;
+  bool isEmptyName_ = false;
+  CVynStringT<wchar_t> modelName_;
+  DexOwnedPointer<DexWeatherInfo> weatherInfo_;
+  DexOwnedPointer<DexSurveyorInfo> surveyorInfo_;
+  DexOwnedPointer<DexSessionPattern> sessionPattern_;
+};
+
+// The base of the sights (backbearing, backsight, foresight, sideshot): a total-station record with
+// an edit state, a note and the coordinates computed for the sight (a value record of its own, owned
+// and duplicated by copies like the measured values).
+//
+// The virtual table continues after those of the base with copyCommonData; the state operations belong
+// to the state interface's table.
+class DEX_API DexTSRawDataSightInterface : public IDexTSRawDataInterface, public IDexStateInterface {
+ public:
+  ~DexTSRawDataSightInterface() override;
+
+ protected:
+  // copyData(target), then the note, the state and the coordinates. The sight kinds add their own
+  // fields. A null target, or this record itself, does nothing.
+  virtual void copyCommonData(DexTSRawDataSightInterface* target) const;
+
+ public:
+  void setStateType(ECurrentState state) override { state_ = state; }
+  ECurrentState getStateType() const override { return state_; }
+
+  void setNote(const CVynStringT<wchar_t>& note) { note_ = note; }
+  const CVynStringT<wchar_t>& getNote() const noexcept { return note_; }
+  // A null argument removes the coordinates; otherwise they become a copy of *xyz.
+  void setXyz(const DexTSRawData* xyz);
+  // Stores x, y and z as values 0, 1 and 2 of the coordinates record, made with contents CONTENTS_NEU
+  // when none is held (a held record keeps its contents type and fourth value).
+  void setXyz(double x, double y, double z);
+  // The coordinates computed for the sight, or null.
+  const DexTSRawData* getXyz() const noexcept { return xyz_.get(); }
+
+ protected:
+  // No note, no coordinates, the given state.
+  explicit DexTSRawDataSightInterface(ECurrentState state);
+  DexTSRawDataSightInterface(const DexTSRawDataSightInterface&) = default;
+  DexTSRawDataSightInterface& operator=(const DexTSRawDataSightInterface&) = default;
+
+ private:
+  CVynStringT<wchar_t> note_;
+  ECurrentState state_;
+  DexOwnedPointer<DexTSRawData> xyz_;
 };
 
 }  // namespace vyn::ie

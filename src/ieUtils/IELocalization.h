@@ -1,14 +1,22 @@
 #pragma once
 
+#include <array>
+#include <cstdint>
+
 #include "hostlibs/DexApi.h"
 #include "hostlibs/VynAlloc.h"
+#include "hostlibs/VynArray.h"
 #include "hostlibs/VynString.h"
 #include "ieObjects/IECodesDataInterface.h"
+#include "ieObjects/IECoords.h"
+#include "ieObjects/IEGPSRawData.h"
 #include "ieObjects/IEInterfaces.h"
+#include "ieObjects/IEOwnedPointer.h"
+#include "ieObjects/IEOwningList.h"
 #include "ieObjects/IETypedValues.h"
 
-// The localization of a job: the parameters of the plane transformation that ties the local grid to
-// GNSS observations, and the names of datum, grid and geoid. The data container owns at most one.
+// The localization of a job: the plane transformation that ties the local grid to GNSS observations,
+// its control points and the names of datum, grid and geoid. The data container owns at most one.
 namespace vyn::ie {
 
 // How a localization is computed, and which points it uses. The host and the plug-ins fix the values;
@@ -17,8 +25,75 @@ namespace vyn::ie {
 enum EDexLocalizationMethod : int {};
 enum EDexLocalizationPoint : int {};
 
-// A localization: 15 transformation parameters, whether the plane scale is held at exactly 1, and the
-// geoid, grid, datum and localization names.
+namespace cs_utils {
+
+// One station record of a localization as the host's coordinate-system component defines it: 214
+// bytes that the library keeps and copies as a whole, reading nothing inside.
+struct DEX_API DexLocalizationStation {
+  VYN_CLASS_ALLOCATOR
+
+  static constexpr int kSize = 214;
+
+  std::array<std::uint8_t, kSize> bytes{};
+};
+static_assert(sizeof(DexLocalizationStation) == DexLocalizationStation::kSize);
+
+}  // namespace cs_utils
+
+// One control point of a localization: the GNSS observation of the point, its residuals in the
+// transformation, three flags for how the transformation uses it, a name and notes.
+//
+// Ownership: the point owns its observation and its residuals and deletes them with itself; copy
+// construction and assignment duplicate both (the observation through its clone()).
+//
+// The virtual operations: destructor, setName, getName.
+class DEX_API DexLocalizationPoint : private IDexNameInterface {
+ public:
+  VYN_CLASS_ALLOCATOR
+
+  // No observation, no residuals, flags false, empty texts.
+  DexLocalizationPoint();
+  DexLocalizationPoint(const DexLocalizationPoint&) = default;
+  DexLocalizationPoint& operator=(const DexLocalizationPoint&) = default;
+  ~DexLocalizationPoint() override;
+
+  void setName(const CVynStringT<wchar_t>& name) override { name_ = name; }
+  const CVynStringT<wchar_t>& getName() const override { return name_; }
+  void setNotes(const CVynStringT<wchar_t>& notes) { notes_ = notes; }
+  const CVynStringT<wchar_t>& getNotes() const noexcept { return notes_; }
+
+  // Takes ownership of rawData (null allowed) and deletes the observation held before, unless it is
+  // the same pointer.
+  void setRawData(DexGpsPosition* rawData) noexcept { rawData_.reset(rawData); }
+  const DexGpsPosition* getRawData() const noexcept { return rawData_.get(); }
+  // Takes ownership of residuals (null allowed) as setRawData does.
+  void setResiduals(DexPosition3D* residuals) noexcept { residuals_.reset(residuals); }
+  const DexPosition3D* getResiduals() const noexcept { return residuals_.get(); }
+
+  // The three usage flags; getUsage answers them in the order setUsage takes them.
+  void setUsage(bool a, bool b, bool c) noexcept;
+  void getUsage(bool& a, bool& b, bool& c) const noexcept;
+
+  // Appends a copy of codes to the observation's codes; nothing without an observation.
+  void attachCodes(const DexCodesDataInterface& codes);
+
+ private:
+  DexOwnedPointer<DexGpsPosition, DexCopyByCloneAs> rawData_;
+  DexOwnedPointer<DexPosition3D> residuals_;
+  // Laid out as the host's record has them: the second and third flag of setUsage, then the first.
+  bool usageB_ = false;
+  bool usageC_ = false;
+  bool usageA_ = false;
+  CVynStringT<wchar_t> name_;
+  CVynStringT<wchar_t> notes_;
+};
+
+// A localization: 15 transformation parameters, whether the plane scale is held at exactly 1, the
+// control points, the station records of the host's coordinate-system component, and the geoid, grid,
+// datum and localization names.
+//
+// Ownership: the localization owns its control points and deletes them with itself; copy construction
+// and assignment duplicate every point (two localizations never share one).
 //
 // The virtual operations keep their order: destructor, setName, getName, setData, getData.
 class DEX_API DexLocalization : public IDexNameInterface {
@@ -34,7 +109,7 @@ class DEX_API DexLocalization : public IDexNameInterface {
   };
   static constexpr int kNumberOfParams = 15;
 
-  // All parameters 0, scale not held, datum "WGS84", the other names empty.
+  // All parameters 0, scale not held, no points or stations, datum "WGS84", the other names empty.
   DexLocalization();
   DexLocalization(const DexLocalization&) = default;
   DexLocalization& operator=(const DexLocalization&) = default;
@@ -66,14 +141,28 @@ class DEX_API DexLocalization : public IDexNameInterface {
   // Whether the scale is held does not change.
   void setAngleAndScale(double angle, double scale);
 
-  // ---- Control points -------------------------------------------------------------------------------
-  // Hands a copy of codes to the GNSS observation of the first control point of that name. A
-  // localization without control points, or null codes, changes nothing.
+  // ---- Control points (owned) ---------------------------------------------------------------------
+  // Appends point and takes ownership; a null point is ignored.
+  void addPoint(DexLocalizationPoint* point) { points_.add(point); }
+  int getNumberOfPoints() const noexcept { return points_.count(); }
+  // The point at index, or null when index is outside the list.
+  const DexLocalizationPoint* getPointAt(int index) const noexcept { return points_.at(index); }
+  // Hands a copy of codes to the observation of the first control point (in insertion order) whose
+  // observation is named exactly pointName. Null codes, or no such point, change nothing.
   void addPointCodes(const CVynStringT<wchar_t>& pointName, const DexCodesDataInterface* codes);
+
+  // ---- Station records ----------------------------------------------------------------------------
+  // Appends a copy of station.
+  void addStation(const cs_utils::DexLocalizationStation& station) { stations_.push_back(station); }
+  int getNumberOfStations() const noexcept { return static_cast<int>(stations_.size()); }
+  // The stored record at index, or null when index is outside the list.
+  const cs_utils::DexLocalizationStation* getStationAt(int index) const noexcept;
 
  private:
   DexTypedValues<ELocalizationParam, kNumberOfParams> params_;
   bool keepScale1_ = false;
+  DexOwningList<DexLocalizationPoint> points_;
+  vyn_vector<cs_utils::DexLocalizationStation> stations_;
   CVynStringT<wchar_t> geoidName_;
   CVynStringT<wchar_t> gridName_;
   CVynStringT<wchar_t> datumName_;

@@ -1,9 +1,11 @@
 #include "ieUtils/IImporter.h"
 
 #include <memory>
+#include <utility>
 
 #include "ieObjects/IEData.h"
 #include "ieObjects/IEDataset.h"
+#include "ieUtils/IELocalization.h"
 #include "ieUtils/IEParsersLoader.h"
 #include "ieUtils/IERunProgress.h"
 #include "ieUtils/IESettings.h"
@@ -46,6 +48,27 @@ DexImporterImpl::DexImporterImpl(DexData* data, const CVynStringT<wchar_t>& file
 }
 
 DexImporterImpl::~DexImporterImpl() = default;
+
+DexImporterImplWithLocalization::DexImporterImplWithLocalization(DexData* data,
+                                                                 const CVynStringT<wchar_t>& fileName,
+                                                                 const DexFormat* format)
+    : DexImporterImpl(data, fileName, format) {}
+
+DexImporterImplWithLocalization::~DexImporterImplWithLocalization() = default;
+
+void DexImporterImplWithLocalization::addLocalizationPt(const DexLocalizationPoint& point) {
+  const DexGpsPosition* const rawData = point.getRawData();
+  const DexStation* const station = rawData != nullptr ? rawData->getPlaneStation() : nullptr;
+  if (station == nullptr) return;
+  localizationPoints.try_emplace(station->getName(), station->getX(), station->getY(), station->getZ());
+}
+
+bool DexImporterImplWithLocalization::isPointUsedInLocalization(const CVynStringT<wchar_t>& name,
+                                                                const DexPosition3D& position) const {
+  if (data == nullptr || std::as_const(*data).getIELocalization() == nullptr) return false;
+  const auto found = localizationPoints.find(name);
+  return found != localizationPoints.end() && found->second == position;
+}
 
 EDexResult ImportFunction(DexParserThreadParams* params) {
   if (params == nullptr) return DEX_RESULT_FAILED;

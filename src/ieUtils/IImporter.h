@@ -1,17 +1,22 @@
 #pragma once
 
+#include <map>
+
 #include "hostlibs/DexApi.h"
 #include "hostlibs/VynAlloc.h"
 #include "hostlibs/VynString.h"
 #include "ieDefinitions/IEFormats.h"
 #include "ieDefinitions/IEResult.h"
+#include "ieObjects/IECoords.h"
 
 // The importer side of a parser plug-in: the interface the loader runs, the base every importer
-// derives from, the plug-in's "MakeImporter" entry point, and the run function of one import.
+// derives from (and the one of importers that read a localization), the plug-in's "MakeImporter" entry
+// point, and the run function of one import.
 
 namespace vyn::ie {
 
 class DexData;
+class DexLocalizationPoint;
 class IDexImporter;
 struct DexParserThreadParams;
 
@@ -91,6 +96,39 @@ class DEX_API DexImporterImpl : public IDexImporter {
   DexData* data;                  // the container to fill; not owned
   CVynStringT<wchar_t> fileName;  // the file to read
   const DexFormat* format;        // the format being read; not owned
+};
+
+// The base of the importers of formats that carry a localization together with ordinary points. While
+// reading the localization the importer hands each control point to addLocalizationPt, which
+// remembers the plane coordinates of its station by the station's name; for each ordinary point read
+// afterwards, isPointUsedInLocalization tells whether it is one of the control points. The remembered
+// coordinates live as long as the importer.
+//
+// Virtual operations, in this order: the destructor, doImport.
+class DEX_API DexImporterImplWithLocalization : public DexImporterImpl {
+ public:
+  VYN_CLASS_ALLOCATOR
+
+  // Copies the fields and the remembered coordinates.
+  DexImporterImplWithLocalization(const DexImporterImplWithLocalization& other) = default;
+  DexImporterImplWithLocalization& operator=(const DexImporterImplWithLocalization& other) = default;
+
+ protected:
+  // The base constructor; no coordinates remembered.
+  DexImporterImplWithLocalization(DexData* data, const CVynStringT<wchar_t>& fileName,
+                                  const DexFormat* format);
+  ~DexImporterImplWithLocalization() override;
+
+  // Remembers the x, y, z of the plane station of point's observation under the station's name. A
+  // point without observation or plane station changes nothing; a name remembered already keeps its
+  // first coordinates.
+  void addLocalizationPt(const DexLocalizationPoint& point);
+  // True when the data holds a localization and position equals (each coordinate within 1e-12) the
+  // coordinates remembered under exactly name.
+  bool isPointUsedInLocalization(const CVynStringT<wchar_t>& name, const DexPosition3D& position) const;
+
+ private:
+  std::map<CVynStringT<wchar_t>, DexPosition3D> localizationPoints;
 };
 
 // ---- The plug-in's entry point ---------------------------------------------------------------------

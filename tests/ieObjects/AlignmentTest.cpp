@@ -14,28 +14,36 @@ namespace {
 
 using vyn::ie::DexAlignment;
 using vyn::ie::DexHorizontalAlignment;
+using vyn::ie::DexVerticalAlignment;
 using vyn::ie::IDexAlignmentPart;
 namespace detail = vyn::ie::detail;
 
-const std::wstring kSource = detail::kAlignmentLogSource;
+constexpr const wchar_t* kSource = detail::kAlignmentLogSource;
 
-TEST(DexAlignment, NewAlignmentIsKindNineInStateOneWithoutParts) {
-  DexAlignment alignment;
-  EXPECT_EQ(9, alignment.getType());
-  EXPECT_EQ(1, alignment.getStateType());
-  for (int type = 0; type < IDexAlignmentPart::kNumberOfPartTypes; ++type)
-    EXPECT_EQ(nullptr, alignment.getAlignmentPart(type));
-  EXPECT_EQ(nullptr, alignment.getStaEquationSet());
-}
-
-TEST(DexAlignment, FirstPartOfAKindIsThePrimaryOne) {
+TEST(DexAlignment, FirstPartOfAKindIsThePrimaryOneAndEveryPartIsIncluded) {
   DexHorizontalAlignment first;
   DexHorizontalAlignment second;
+  second.setName(L"H");
+  DexHorizontalAlignment namesake;
+  namesake.setName(L"H");
+  DexVerticalAlignment vertical;
   DexAlignment alignment;
-  alignment.setAlignmentPart(&first);
-  alignment.setAlignmentPart(&second);
+  EXPECT_FALSE(alignment.isAlignPartIncluded(&first, false));
+  IDexAlignmentPart* const listed[] = {&first, &vertical, &second, &first};
+  for (IDexAlignmentPart* part : listed)
+    alignment.setAlignmentPart(part);
   EXPECT_EQ(&first, alignment.getAlignmentPart(IDexAlignmentPart::HORIZONTAL_ALIGNMENT));
-  EXPECT_EQ(nullptr, alignment.getAlignmentPart(IDexAlignmentPart::VERTICAL_ALIGNMENT));
+  EXPECT_EQ(&vertical, alignment.getAlignmentPart(IDexAlignmentPart::VERTICAL_ALIGNMENT));
+  EXPECT_EQ(nullptr, alignment.getAlignmentPart(IDexAlignmentPart::CROSS_SECTION_SET));
+  ASSERT_EQ(4, alignment.getNumberOfAlignmentParts());
+  for (int i = 0; i < 4; ++i)
+    EXPECT_EQ(listed[i], alignment.getAlignmentPartAt(i));
+  EXPECT_EQ(nullptr, alignment.getAlignmentPartAt(4));
+  for (const bool deep : {false, true}) {
+    EXPECT_TRUE(alignment.isAlignPartIncluded(&second, deep));
+    EXPECT_FALSE(alignment.isAlignPartIncluded(&namesake, deep));  // by identity, not by name
+    EXPECT_FALSE(alignment.isAlignPartIncluded(nullptr, deep));
+  }
 }
 
 TEST(DexAlignment, NullPartsAndUnknownKindsAreReported) {
@@ -86,19 +94,6 @@ TEST(DexAlignment, CopySharesPartsAndDuplicatesDrawProperties) {
   ASSERT_NE(nullptr, copy.getDrawProperties());
   EXPECT_NE(alignment.getDrawProperties(), copy.getDrawProperties());
   EXPECT_EQ(0x00FF00u, objects_test::colorOf(copy.getDrawProperties()));
-}
-
-TEST(DexHorizontalAlignment, IsAHorizontalPartInStateOne) {
-  DexHorizontalAlignment alignment;
-  EXPECT_EQ(IDexAlignmentPart::HORIZONTAL_ALIGNMENT, alignment.getType());
-  EXPECT_EQ(1, alignment.getStateType());
-  EXPECT_EQ(nullptr, alignment.getStartPoint());
-  alignment.setName(L"H1");
-  alignment.setStaStart(100.0);
-  alignment.setLength(250.0);
-  EXPECT_EQ(L"H1", alignment.getName());
-  EXPECT_EQ(100.0, alignment.getStaStart());
-  EXPECT_EQ(250.0, alignment.getLength());
 }
 
 }  // namespace

@@ -488,18 +488,28 @@ TEST(DataDictionaries, AlignmentPartOfAnUnknownKindIsDeclinedWithTheDictionarysR
   EXPECT_EQ(1, log.count(L"ieObjects\\IEAlignmentPartsDictionary", 802));
 }
 
+// A valid station-equation set of one equation; distinct aheads keep sets unequal.
+DexStaEquationSet* newSet(const wchar_t* name, double ahead) {
+  auto* const set = new DexStaEquationSet(name);
+  vyn::ie::DexStaEquation equation;
+  equation.setData(vyn::ie::DexStaEquation::RUNNING_CHAINAGE, 0.0);
+  equation.setData(vyn::ie::DexStaEquation::STATION_AHEAD, ahead);
+  set->addEquation(&equation);
+  return set;
+}
+
 TEST(DataDictionaries, StationEquationSetIsDeclinedForAnExistingName) {
   DexData data(DexSettings{});
-  auto* const main = new DexStaEquationSet(L"main");
+  auto* const main = newSet(L"main", 1.0);
   EXPECT_TRUE(data.addIEStaEquationSetToDictionary(main));
 
-  auto* const again = new DexStaEquationSet(L"main");
+  auto* const again = newSet(L"main", 2.0);
   EXPECT_FALSE(data.addIEStaEquationSetToDictionary(again));
   delete again;
   EXPECT_TRUE(data.addIEStaEquationSetToDictionary(main));
-  EXPECT_TRUE(data.addIEStaEquationSetToDictionary(new DexStaEquationSet(L"ramp")));
-  EXPECT_TRUE(data.addIEStaEquationSetToDictionary(new DexStaEquationSet()));
-  EXPECT_TRUE(data.addIEStaEquationSetToDictionary(new DexStaEquationSet()));
+  EXPECT_TRUE(data.addIEStaEquationSetToDictionary(newSet(L"ramp", 3.0)));
+  EXPECT_TRUE(data.addIEStaEquationSetToDictionary(newSet(L"", 4.0)));
+  EXPECT_TRUE(data.addIEStaEquationSetToDictionary(newSet(L"", 5.0)));
 
   EXPECT_EQ(4, data.getIEStaEquationSetDictionary()->getNumberOfElements());
   EXPECT_EQ(main, data.getIEStaEquationSetDictionary()->findStaEquationSet(L"main"));
@@ -920,7 +930,7 @@ TEST(DataOwnership, ReleasesEveryKindOfMember) {
   data.getIEDrawDictionary()->addLayer(new DexLayer());
   data.addIERoadTemplateToDictionary(new DexRoadTemplate(L"crown"));
   data.addIEAlignmentPartToDictionary(new Part(IDexAlignmentPart::CROSS_SECTION_SET, L"X"));
-  data.addIEStaEquationSetToDictionary(new DexStaEquationSet(L"main"));
+  EXPECT_TRUE(data.addIEStaEquationSetToDictionary(newSet(L"main", 1.0)));
   data.attachIELocalization(new DexLocalization());
   data.addDLRun(new DexDLRun(L"R1", L""));
   data.addGpsAntenna(new DexGpsAntennaSettings());

@@ -43,6 +43,37 @@ std::string Arguments::value(const std::string& name, const std::string& fallbac
   return found == values_.end() ? fallback : found->second;
 }
 
+std::string optionsHelp(const std::vector<Option>& options) {
+  constexpr std::size_t kHelpColumn = 21;
+  std::string text;
+  for (const Option& option : options) {
+    std::string head = "  --" + option.name + (option.value.empty() ? "" : " " + option.value);
+    head += head.size() + 1 < kHelpColumn ? std::string(kHelpColumn - head.size(), ' ')
+                                          : "\n" + std::string(kHelpColumn, ' ');
+    std::string help = option.help;
+    for (std::size_t at = help.find('\n'); at != std::string::npos; at = help.find('\n', at + 1))
+      help.insert(at + 1, std::string(kHelpColumn, ' '));
+    text += head + help + "\n";
+  }
+  return text;
+}
+
+std::set<std::string> Command::flags() const {
+  std::set<std::string> names;
+  for (const Option& option : options()) {
+    if (option.value.empty()) names.insert(option.name);
+  }
+  return names;
+}
+
+std::set<std::string> Command::valuedOptions() const {
+  std::set<std::string> names;
+  for (const Option& option : options()) {
+    if (!option.value.empty()) names.insert(option.name);
+  }
+  return names;
+}
+
 int fail(ToolStreams& streams, int exitCode, const std::string& message) {
   streams.err << "dexchange: " << message << '\n';
   return exitCode;

@@ -40,6 +40,16 @@ class Arguments {
   std::vector<std::string> positional_;
 };
 
+// One option of a command: "--name" alone (a flag) or "--name VALUE" when value names the value.
+struct Option {
+  std::string name;
+  std::string value;  // the placeholder of the value in the help ("FORMAT"); empty for a flag
+  std::string help;   // its help text; a line break starts an indented line
+};
+
+// The help lines of options, aligned.
+std::string optionsHelp(const std::vector<Option>& options);
+
 // One sub-command of the tool. A command declares its options; the framework answers --help for it
 // and turns an unknown option into a one-line usage error.
 class Command {
@@ -49,8 +59,10 @@ class Command {
   virtual std::string summary() const = 0;
   // The full help text shown by "dexchange <name> --help".
   virtual std::string help() const = 0;
-  virtual std::set<std::string> flags() const { return {}; }
-  virtual std::set<std::string> valuedOptions() const { return {}; }
+  // The options as a table; flags() and valuedOptions() are read from it unless overridden.
+  virtual std::vector<Option> options() const { return {}; }
+  virtual std::set<std::string> flags() const;
+  virtual std::set<std::string> valuedOptions() const;
   // Runs the command; a failure writes one line to streams.err and answers a non-zero exit code.
   virtual int run(const Arguments& arguments, ToolStreams& streams) const = 0;
 };

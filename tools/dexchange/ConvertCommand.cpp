@@ -4,23 +4,15 @@
 
 #include "Command.h"
 #include "ExchangeRun.h"
+#include "RunReport.h"
+#include "ToolText.h"
 #include "ieObjects/IEData.h"
 #include "ieObjects/IEDataset.h"
+#include "ieUtils/IELinework.h"
+#include "ieUtils/IEUtilsUnitWords.h"
 
 namespace dexchange_tool {
 namespace {
-
-const char* const kOptionsHelp =
-    "  --from FORMAT      the format of IN: a braced GUID, a format name or title, or an extension\n"
-    "                     (default: the extension of IN)\n"
-    "  --to FORMAT        the format of OUT, likewise (default: the extension of OUT)\n"
-    "  --types LIST       the data kinds to exchange (POINTS,LINES,...; default: those of the IN format)\n"
-    "  --fields LIST      the columns of a customizable ASCII point file, as point field names\n"
-    "                     (\"Name,Northing,Easting,Ht,Codes&Strings\"); NAME:WIDTH gives a column width\n"
-    "                     and makes the lines fixed-width\n"
-    "  --delimiter C      the delimiter of a customizable ASCII point file: one character, or tab,\n"
-    "                     space, comma, semicolon, pipe (default: comma)\n"
-    "  --units UNIT       the distance unit of the files (METERS, USFEET, IFEET, ...; default: meters)\n";
 
 // Whether OUT may be overwritten: --force, or a yes on a terminal. False with the reason otherwise.
 bool mayOverwrite(const Arguments& arguments, const std::string& path, std::string& error) {
@@ -37,69 +29,106 @@ bool mayOverwrite(const Arguments& arguments, const std::string& path, std::stri
   return false;
 }
 
-int countObjects(vyn::ie::DexData& data) {
-  int count = 0;
-  for (int i = 0; i < data.getNumberOfDatasets(); ++i)
-    count += data.getDatasetAt(i)->getNumberOfElements(vyn::ie::OBJECT_TYPE_ALL, 2);
-  return count;
-}
-
 class ConvertCommand final : public Command {
  public:
   std::string name() const override { return "convert"; }
   std::string summary() const override { return "convert a file from one exchange format to another"; }
   std::string help() const override {
-    return std::string(
-               "usage: dexchange convert IN OUT [--from FORMAT] [--to FORMAT] [--types LIST]\n"
-               "                        [--fields LIST] [--delimiter C] [--units UNIT] [--force]\n"
-               "\n"
-               "Imports IN into a data container through the plug-in of its format, then exports the\n"
-               "container to OUT, each run in a worker thread (a progress bar on a terminal; Ctrl-C stops\n"
-               "the run, and a stopped export leaves no file behind).\n") +
-           kOptionsHelp +
-           "  --force            overwrite OUT when it exists (on a terminal the tool asks; otherwise it\n"
-           "                     refuses)\n"
+    return "usage: dexchange convert IN OUT [--from FORMAT] [--to FORMAT] [--types LIST]\n"
+           "                        [--fields LIST | --order ORDER] [--delimiter C] [--units UNIT]\n"
+           "                        [--linework] [--force] [--json]\n"
+           "\n"
+           "Imports IN into a data container through the plug-in of its format, then exports the\n"
+           "container to OUT, each run in a worker thread (a progress bar on a terminal; Ctrl-C stops\n"
+           "the run, and a stopped export leaves no file behind). --fields, --order and --delimiter\n"
+           "describe IN when it is a point file (a header line that names its columns decides them)\n"
+           "and OUT when it is a customizable ASCII point file; CSV files are written in the CSV\n"
+           "columns.\n"
+           "\n" +
+           optionsHelp(options()) +
            "\n"
            "Exit codes: 0 converted (notes on stderr tell of skipped lines), 1 the import or export\n"
            "failed, 2 wrong command line, 130 stopped.\n";
   }
-  std::set<std::string> flags() const override { return {"force"}; }
-  std::set<std::string> valuedOptions() const override {
-    return {"from", "to", "types", "fields", "delimiter", "units"};
+  std::vector<Option> options() const override {
+    std::vector<Option> all = inputOptions();
+    all.insert(all.begin() + 1,
+               {"to", "FORMAT", "the format of OUT, as --from (default: the extension of OUT)"});
+    all.push_back({"linework", "",
+                   "join the points whose codes carry code strings (EP:1, KERB:L) into one\n"
+                   "polyline per code and string before the export, and export lines"});
+    all.push_back(
+        {"force", "", "overwrite OUT when it exists (on a terminal the tool asks; otherwise it\nrefuses)"});
+    all.push_back(jsonOption());
+    return all;
   }
 
   int run(const Arguments& arguments, ToolStreams& streams) const override {
     if (arguments.positional().size() != 2) return fail(streams, kExitUsage, "convert: give IN and OUT");
-    const std::string& in = arguments.positional()[0];
-    const std::string& out = arguments.positional()[1];
+    RunReport report;
+    report.command = "convert";
+    report.input.file = arguments.positional()[0];
+    report.output.file = arguments.positional()[1];
     std::string error;
-    const auto from = FormatChoice::find(arguments.value("from"), in, false, error);
+    const auto from = FormatChoice::find(arguments.value("from"), report.input.file, false, error);
     if (!from) return fail(streams, kExitUsage, "convert: " + error);
-    const auto to = FormatChoice::find(arguments.value("to"), out, true, error);
+    const auto to = FormatChoice::find(arguments.value("to"), report.output.file, true, error);
     if (!to) return fail(streams, kExitUsage, "convert: " + error);
+    report.input.format = from.get();
+    report.output.format = to.get();
     vyn::ie::DexSettings settings;
     if (!makeSettings(arguments, *from->format(), true, settings, error))
       return fail(streams, kExitUsage, "convert: " + error);
-    if (!fileExists(in)) return fail(streams, kExitFailure, "convert: " + in + " not found");
-    if (!mayOverwrite(arguments, out, error)) return fail(streams, kExitFailure, "convert: " + error);
+    const bool linework = arguments.has("linework");
+    if (linework) settings.addDataType(vyn::ie::LINES);
+    if (!fileExists(report.input.file))
+      return fail(streams, kExitFailure, "convert: " + report.input.file + " not found");
+    if (!mayOverwrite(arguments, report.output.file, error))
+      return fail(streams, kExitFailure, "convert: " + error);
 
     vyn::ie::DexParsersLoader loader;
     loader.initIEData(settings);
-    const RunOutcome imported = runInWorker(loader, false, in, *from->format());
-    printNotes(streams, imported);
-    if (imported.result < 0) {
-      return fail(streams, exitCodeOf(imported.result),
-                  "convert: " + failureText(imported.result, false, in, from->name(), loader));
+    report.data = loader.getIEData();
+    report.units = utf8(vyn::ie::utils::keywordFromDistUnits(settings.distUnits));
+    if (runSide(loader, report.input, false, report)) {
+      if (linework) report.lineworkPolylines = createLinework(*report.data);
+      runSide(loader, report.output, true, report);
     }
-    const RunOutcome exported = runInWorker(loader, true, out, *to->format());
-    printNotes(streams, exported);
-    if (exported.result < 0) {
-      return fail(streams, exitCodeOf(exported.result),
-                  "convert: " + failureText(exported.result, true, out, to->name(), loader));
+    printSummary(streams, arguments.has("json"), report);
+    return report.error.empty() ? kExitOk : fail(streams, report.exitCode, report.error);
+  }
+
+ private:
+  static int createLinework(vyn::ie::DexData& data) {
+    int polylines = 0;
+    for (int i = 0; i < data.getNumberOfDatasets(); ++i)
+      polylines += vyn::ie::utils::createLineworkFromCodes(*data.getDatasetAt(i));
+    return polylines;
+  }
+
+  // One run with its notes; false (with the report's error) when it failed.
+  static bool runSide(vyn::ie::DexParsersLoader& loader, RunSide& side, bool exportRun, RunReport& report) {
+    side.finish(runInWorker(loader, exportRun, side.file, *side.format->format()));
+    report.exitCode = exitCodeOf(side.outcome.result);
+    if (side.outcome.result >= 0) return true;
+    report.error =
+        "convert: " + failureText(side.outcome.result, exportRun, side.file, side.format->name(), loader);
+    return false;
+  }
+
+  static void printSummary(ToolStreams& streams, bool json, const RunReport& report) {
+    for (const RunSide* side : {&report.input, &report.output}) {
+      if (side->ran) printNotes(streams, side->outcome);
     }
-    streams.out << "converted " << countObjects(*loader.getIEData()) << " objects from " << in << " ("
-                << from->name() << ") to " << out << " (" << to->name() << ")\n";
-    return kExitOk;
+    if (json) {
+      streams.out << jsonReport(report);
+    } else if (report.error.empty()) {
+      if (report.lineworkPolylines >= 0)
+        streams.out << "linework: " << report.lineworkPolylines << " polylines from point codes\n";
+      streams.out << "converted " << report.data->getNumberOfObjectsInAllDatasets() << " objects from "
+                  << report.input.file << " (" << report.input.format->name() << ") to " << report.output.file
+                  << " (" << report.output.format->name() << ")\n";
+    }
   }
 };
 

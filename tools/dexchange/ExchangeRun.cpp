@@ -9,6 +9,7 @@
 #include <string>
 #include <vector>
 
+#include "ToolText.h"
 #include "hostlibs/VynLogging.h"
 #include "hostlibs/winport.h"
 #include "ieDefinitions/IEFormatWords.h"
@@ -16,6 +17,8 @@
 #include "ieObjects/IEData.h"
 #include "ieUtils/IEAsciiFields.h"
 #include "ieUtils/IEUtilsUnitWords.h"
+#include "pointfiles/LayoutFinding.h"
+#include "pointfiles/PointLayout.h"
 
 namespace dexchange_tool {
 
@@ -27,145 +30,30 @@ bool fileExists(const std::string& path) {
   return PathFileExistsW(wide(path)) != 0;
 }
 
-std::string utf8(const WideString& text) {
-  return vyn_text::toUtf8(text.view());
+std::vector<Option> inputOptions() {
+  return {
+      {"from", "FORMAT",
+       "the format of the file read: a braced GUID, a registry index, a format name\n"
+       "or title (or a unique beginning of one, case ignored), or an extension\n"
+       "(default: the extension of the file)"},
+      {"types", "LIST", "the data kinds to exchange (POINTS,LINES,...; default: those of the format)"},
+      {"fields", "LIST",
+       "the columns of a point file, as point field names\n"
+       "(\"Name,Northing,Easting,Ht,Codes&Strings\"); NAME:WIDTH gives a column width\n"
+       "and makes the lines fixed-width"},
+      {"order", "ORDER",
+       "the columns of a point file as an order name: PNEZD, PENZD, PNEZ, PENZ, NEZ,\n"
+       "ENZ, PNE, PEN, ... (P name, N northing, E easting, Z height, D code)"},
+      {"delimiter", "C",
+       "the delimiter of a point file: one character, or tab, space, comma,\n"
+       "semicolon, pipe (default: found from the first lines)"},
+      {"units", "UNIT",
+       "the distance unit of the files (METERS, USFEET, IFEET, ...; default: as in the file)"},
+  };
 }
 
-WideString wide(const std::string& text) {
-  return WideString(text.c_str(), vyn_text::CP_UTF8);
-}
-
-namespace {
-
-// The formats the shipped plug-ins read and write, with their libraries.
-constexpr const wchar_t* kShippedFormats[] = {L"{A9A6A37F-F823-4509-9B41-3AC02B45CAA2}",
-                                              L"{5F39DDC1-F0FD-4F27-938A-96EFF426CD60}"};
-constexpr const wchar_t* kShippedImportLibrary = L"ImportParsers";
-constexpr const wchar_t* kShippedExportLibrary = L"ExportParsers";
-
-bool isShipped(const DexFormat& format) {
-  return std::any_of(std::begin(kShippedFormats), std::end(kShippedFormats),
-                     [&format](const wchar_t* id) { return format.isIdEqual(id); });
-}
-
-std::string lowerCase(std::string text) {
-  std::transform(text.begin(), text.end(), text.begin(),
-                 [](unsigned char ch) { return static_cast<char>(std::tolower(ch)); });
-  return text;
-}
-
-std::string extensionOf(const std::string& path) {
-  const std::size_t slash = path.find_last_of('/');
-  const std::size_t dot = path.find_last_of('.');
-  if (dot == std::string::npos || (slash != std::string::npos && dot < slash)) return {};
-  return path.substr(dot + 1);
-}
-
-// Whether the format names the extension (lower case, no dot) as its own or in its dialog filter.
-int extensionMatch(const DexFormat& format, const std::string& extension) {
-  if (lowerCase(utf8(format.getExtension(false))) == extension) return 2;
-  const std::string filter = lowerCase(utf8(format.getFilterExtension()));
-  const std::string pattern = "*." + extension;
-  for (std::size_t at = filter.find(pattern); at != std::string::npos; at = filter.find(pattern, at + 1)) {
-    const std::size_t end = at + pattern.size();
-    if (end == filter.size() || filter[end] == ';' || filter[end] == ')' || filter[end] == '|') return 1;
-  }
-  return 0;
-}
-
-const DexFormat* findByExtension(const std::string& extension, bool forExport) {
-  const vyn::ie::DexFormatsData& registry = vyn::ie::getIEFormatsData();
-  const DexFormat* best = nullptr;
-  int bestRank = 0;
-  for (unsigned int i = 0; i < registry.getNumberOfFormats(); ++i) {
-    const DexFormat* format = registry.getFormatByIndex(i);
-    const int match = format == nullptr ? 0 : extensionMatch(*format, extension);
-    if (match == 0) continue;
-    // Shipped formats first, then the own extension before a filter's, then a library for the direction.
-    const int rank =
-        (isShipped(*format) ? 8 : 0) + match * 2 + (format->getDllName(forExport).IsEmpty() ? 0 : 1);
-    if (rank > bestRank) {
-      best = format;
-      bestRank = rank;
-    }
-  }
-  return best;
-}
-
-const DexFormat* findByName(const std::string& spec) {
-  const vyn::ie::DexFormatsData& registry = vyn::ie::getIEFormatsData();
-  const WideString wanted = wide(spec);
-  for (unsigned int i = 0; i < registry.getNumberOfFormats(); ++i) {
-    const DexFormat* format = registry.getFormatByIndex(i);
-    if (format != nullptr && format->getName().CompareNoCase(wanted) == 0) return format;
-  }
-  for (unsigned int i = 0; i < registry.getNumberOfFormats(); ++i) {
-    const DexFormat* format = registry.getFormatByIndex(i);
-    if (format != nullptr && format->getTitle().CompareNoCase(wanted) == 0) return format;
-  }
-  return nullptr;
-}
-
-// A copy of a shipped format that names the shipped library for the direction the registry lacks.
-std::unique_ptr<DexFormat> completedFormat(const DexFormat& format) {
-  const WideString exportLibrary = format.getDllName(true);
-  const WideString importLibrary = format.getDllName(false);
-  return std::make_unique<DexFormat>(
-      format.getGuid(), format.getName(), DexFormat::IMPORT_AND_EXPORT,
-      exportLibrary.IsEmpty() ? WideString(kShippedExportLibrary) : exportLibrary,
-      importLibrary.IsEmpty() ? WideString(kShippedImportLibrary) : importLibrary, format.getTitle(),
-      format.getExtension(false), format.getFilterExtension(), format.getConfigurations(),
-      format.getUsingModes(), format.getDataTypes(), format.getDistanceUnits(), format.getAngleUnits(),
-      format.getParameters());
-}
-
-}  // namespace
-
-std::unique_ptr<FormatChoice> FormatChoice::find(const std::string& spec, const std::string& path,
-                                                 bool forExport, std::string& error) {
-  const DexFormat* format = nullptr;
-  if (spec.empty()) {
-    const std::string extension = lowerCase(extensionOf(path));
-    if (extension.empty()) {
-      error = "cannot tell the format of " + path + " (no extension): name it with " +
-              (forExport ? "--to" : "--from");
-      return nullptr;
-    }
-    format = findByExtension(extension, forExport);
-    if (format == nullptr) {
-      error = "no format for the extension ." + extension + " of " + path;
-      return nullptr;
-    }
-  } else if (spec.front() == '{') {
-    format = vyn::ie::getIEFormatsData().getFormatById(wide(spec).GetString());
-    if (format == nullptr) {
-      error = "no format with the GUID " + spec;
-      return nullptr;
-    }
-  } else {
-    format = findByName(spec);
-    if (format == nullptr)
-      format = findByExtension(lowerCase(spec.front() == '.' ? spec.substr(1) : spec), forExport);
-    if (format == nullptr) {
-      error = "no format named " + spec;
-      return nullptr;
-    }
-  }
-
-  std::unique_ptr<FormatChoice> choice(new FormatChoice(format));
-  if (format->getDllName(forExport).IsEmpty()) {
-    if (!isShipped(*format)) {
-      error = "the format " + utf8(format->getName()) + " cannot be " + (forExport ? "exported" : "imported");
-      return nullptr;
-    }
-    choice->completed_ = completedFormat(*format);
-    choice->format_ = choice->completed_.get();
-  }
-  return choice;
-}
-
-std::string FormatChoice::name() const {
-  return utf8(format_->getName());
+Option jsonOption() {
+  return {"json", "", "print the report as JSON on stdout (schema in the README)"};
 }
 
 // ---- Settings -----------------------------------------------------------------------------------
@@ -188,18 +76,6 @@ class DecidedMessageBox final : public vyn::ie::IDexMessageBox {
  private:
   bool allow_;
 };
-
-// The items of a comma-separated option value; empty items are kept (and then refused).
-std::vector<std::string> commaItems(const std::string& list) {
-  std::vector<std::string> items;
-  std::size_t start = 0;
-  while (start <= list.size()) {
-    const std::size_t comma = std::min(list.find(',', start), list.size());
-    items.push_back(list.substr(start, comma - start));
-    start = comma + 1;
-  }
-  return items;
-}
 
 bool parseTypes(const std::string& list, vyn::ie::DexSettings& settings, std::string& error) {
   settings.removeAllDataTypes();
@@ -258,6 +134,21 @@ bool parseDelimiter(const std::string& text, wchar_t& delimiter, std::string& er
   return true;
 }
 
+// The point columns of --fields or --order into ascii; false with error for a bad list or both options.
+bool parseColumns(const Arguments& arguments, vyn::ie::DexUserAsciiSettingsData& ascii, std::string& error) {
+  if (arguments.has("fields") && arguments.has("order")) {
+    error = "give --fields or --order, not both";
+    return false;
+  }
+  if (arguments.has("fields")) return parseFields(arguments.value("fields"), ascii, error);
+  if (!arguments.has("order") ||
+      vyn::ie::point_files::fieldsFromOrder(wide(arguments.value("order")).view(), ascii.fields))
+    return true;
+  error = "--order: \"" + arguments.value("order") +
+          "\" is no order of the letters P, N, E, Z, D (N and E required, each once), e.g. PNEZD";
+  return false;
+}
+
 }  // namespace
 
 bool makeSettings(const Arguments& arguments, const DexFormat& importFormat, bool allowOverwrite,
@@ -272,18 +163,13 @@ bool makeSettings(const Arguments& arguments, const DexFormat& importFormat, boo
     }
     settings.distUnits = units;
   }
-  if (arguments.has("fields") || arguments.has("delimiter")) {
-    auto ascii = std::make_unique<vyn::ie::DexUserAsciiSettingsData>();
-    if (arguments.has("fields") && !parseFields(arguments.value("fields"), *ascii, error)) return false;
-    if (!arguments.has("fields")) {
-      vyn::ie::ascii_fields::stringToFields(L"Name,Northing,Easting,Ht,FullCodes", ascii->fields,
-                                            vyn::ie::ascii_fields::OWNER_POINTS);
-    }
-    if (arguments.has("delimiter") && !parseDelimiter(arguments.value("delimiter"), ascii->delimiter, error))
-      return false;
-    delete settings.userAsciiSettings;
-    settings.userAsciiSettings = ascii.release();
-  }
+  auto ascii = std::make_unique<vyn::ie::DexUserAsciiSettingsData>();
+  ascii->delimiter = vyn::ie::point_files::kDelimiterToFind;
+  if (!parseColumns(arguments, *ascii, error)) return false;
+  if (arguments.has("delimiter") && !parseDelimiter(arguments.value("delimiter"), ascii->delimiter, error))
+    return false;
+  delete settings.userAsciiSettings;
+  settings.userAsciiSettings = ascii.release();
   settings.importNotifier = new QuietNotifier();
   settings.exportNotifier = new QuietNotifier();
   settings.messageBox = new DecidedMessageBox(allowOverwrite);

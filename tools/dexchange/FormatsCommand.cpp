@@ -2,6 +2,9 @@
 #include <functional>
 
 #include "Command.h"
+#include "FormatChoice.h"
+#include "Json.h"
+#include "ToolText.h"
 #include "hostlibs/VynString.h"
 #include "ieDefinitions/IEFormatWords.h"
 #include "ieDefinitions/IEFormatsData.h"
@@ -17,14 +20,6 @@ using vyn::ie::DexFormatsData;
 using WideString = CVynStringT<wchar_t>;
 
 // ---- Words --------------------------------------------------------------------------------------
-
-std::string utf8(const WideString& text) {
-  return vyn_text::toUtf8(text.view());
-}
-
-WideString wide(const std::string& text) {
-  return WideString(text.c_str(), vyn_text::CP_UTF8);
-}
 
 // The words of a set's members in value order; a member without a word is shown as "#<value>".
 template <class E>
@@ -49,11 +44,7 @@ std::string joined(const std::vector<std::string>& words, const std::string& sep
 template <class E>
 bool parseWordList(const std::string& list, const std::function<bool(const WideString&, E&)>& lookup,
                    DexFlags<E>& set, std::string& error) {
-  std::size_t start = 0;
-  while (start <= list.size()) {
-    const std::size_t comma = std::min(list.find(',', start), list.size());
-    const std::string word = list.substr(start, comma - start);
-    start = comma + 1;
+  for (const std::string& word : commaItems(list)) {
     E value{};
     if (!lookup(wide(word), value)) {
       error = word.empty() ? "empty word in \"" + list + "\"" : "unknown word " + word;
@@ -83,6 +74,7 @@ struct FormatView {
   std::string guid;
   std::string name;
   std::string direction;
+  std::string tool;  // what the tool does with it through the shipped plug-ins
   std::string title;
   std::string extension;
   std::string filter;
@@ -103,6 +95,9 @@ FormatView viewOf(unsigned int index, const DexFormat& format) {
   view.guid = utf8(format.getGuidAsString());
   view.name = utf8(format.getName());
   view.direction = directionText(format.getDataDirections());
+  view.tool = toolReads(format)    ? (toolWrites(format) ? "read, write" : "read")
+              : toolWrites(format) ? "write"
+                                   : "";
   view.title = utf8(format.getTitle());
   view.extension = utf8(format.getExtension(false));
   view.filter = utf8(format.getFilterExtension());
@@ -159,10 +154,10 @@ std::string librariesCell(const FormatView& view) {
 
 void printTable(std::ostream& out, const std::vector<FormatView>& views) {
   std::vector<std::vector<std::string>> rows;
-  rows.push_back({"#", "Name", "Direction", "Ext", "Data kinds", "Units", "Libraries"});
+  rows.push_back({"#", "Name", "Direction", "Tool", "Ext", "Data kinds", "Units", "Libraries"});
   for (const FormatView& view : views) {
-    rows.push_back({std::to_string(view.index), view.name, view.direction, orDash(view.extension),
-                    dataKindsCell(view), unitsCell(view), librariesCell(view)});
+    rows.push_back({std::to_string(view.index), view.name, view.direction, orDash(view.tool),
+                    orDash(view.extension), dataKindsCell(view), unitsCell(view), librariesCell(view)});
   }
   std::vector<std::size_t> widths(rows.front().size(), 0);
   for (const auto& row : rows) {
@@ -191,6 +186,7 @@ void printDetails(std::ostream& out, const FormatView& view) {
   field("guid", view.guid);
   field("name", view.name);
   field("direction", view.direction);
+  field("tool", view.tool);
   field("title", view.title);
   field("extension", view.extension);
   field("filter", view.filter);
@@ -205,64 +201,26 @@ void printDetails(std::ostream& out, const FormatView& view) {
   field("unit choice", view.hasUnitsToSelect ? "yes" : "no");
 }
 
-std::string jsonString(const std::string& text) {
-  std::string quoted = "\"";
-  for (const char ch : text) {
-    const auto byte = static_cast<unsigned char>(ch);
-    if (ch == '"' || ch == '\\') {
-      quoted += '\\';
-      quoted += ch;
-    } else if (byte < 0x20) {
-      static constexpr char kHex[] = "0123456789abcdef";
-      quoted += "\\u00";
-      quoted += kHex[byte >> 4];
-      quoted += kHex[byte & 0xF];
-    } else {
-      quoted += ch;
-    }
-  }
-  return quoted + '"';
-}
-
-std::string jsonArray(const std::vector<std::string>& words) {
-  std::string text = "[";
-  for (std::size_t i = 0; i < words.size(); ++i)
-    text += (i == 0 ? "" : ", ") + jsonString(words[i]);
-  return text + "]";
-}
-
-std::string jsonObject(const FormatView& view, const std::string& indent) {
-  const std::vector<std::pair<std::string, std::string>> members = {
-      {"index", std::to_string(view.index)},
-      {"guid", jsonString(view.guid)},
-      {"name", jsonString(view.name)},
-      {"direction", jsonString(view.direction)},
-      {"title", jsonString(view.title)},
-      {"extension", jsonString(view.extension)},
-      {"filterExtension", jsonString(view.filter)},
-      {"importLibrary", jsonString(view.importLibrary)},
-      {"exportLibrary", jsonString(view.exportLibrary)},
-      {"configurations", jsonArray(view.configurations)},
-      {"usingModes", jsonArray(view.usingModes)},
-      {"dataTypes", jsonArray(view.dataKinds)},
-      {"distanceUnits", jsonArray(view.distanceUnits)},
-      {"angleUnits", jsonArray(view.angleUnits)},
-      {"parameters", jsonArray(view.parameters)},
-      {"hasUnitsToSelect", view.hasUnitsToSelect ? "true" : "false"},
-  };
-  std::string text = "{\n";
-  for (std::size_t i = 0; i < members.size(); ++i) {
-    text += indent + "  " + jsonString(members[i].first) + ": " + members[i].second;
-    text += i + 1 < members.size() ? ",\n" : "\n";
-  }
-  return text + indent + "}";
+void writeJson(JsonWriter& json, const FormatView& view) {
+  json.beginObject().key("index").value(static_cast<int>(view.index)).key("guid").value(view.guid);
+  json.key("name").value(view.name).key("direction").value(view.direction);
+  json.key("toolReads").value(view.tool.find("read") != std::string::npos);
+  json.key("toolWrites").value(view.tool.find("write") != std::string::npos);
+  json.key("title").value(view.title).key("extension").value(view.extension);
+  json.key("filterExtension").value(view.filter).key("importLibrary").value(view.importLibrary);
+  json.key("exportLibrary").value(view.exportLibrary).key("configurations").texts(view.configurations);
+  json.key("usingModes").texts(view.usingModes).key("dataTypes").texts(view.dataKinds);
+  json.key("distanceUnits").texts(view.distanceUnits).key("angleUnits").texts(view.angleUnits);
+  json.key("parameters").texts(view.parameters).key("hasUnitsToSelect").value(view.hasUnitsToSelect);
+  json.endObject();
 }
 
 void printJson(std::ostream& out, const std::vector<FormatView>& views) {
-  out << "[";
-  for (std::size_t i = 0; i < views.size(); ++i)
-    out << (i == 0 ? "\n  " : ",\n  ") << jsonObject(views[i], "  ");
-  out << (views.empty() ? "]\n" : "\n]\n");
+  JsonWriter json;
+  json.beginArray();
+  for (const FormatView& view : views)
+    writeJson(json, view);
+  out << json.endArray().text();
 }
 
 // ---- The command --------------------------------------------------------------------------------
@@ -275,7 +233,23 @@ struct Query {
   DexFlags<DexCommonType::EUsingModes> modes;
   bool byType = false;
   vyn::ie::EDexDataType type = vyn::ie::POINTS;
+  bool byTool = false;  // what the tool reads or writes, in place of the registry's directions
 };
+
+// Whether the tool serves the format in the direction (either one when none is named).
+bool toolServes(const DexFormat& format, const std::vector<DexCommonType::EDataDirections>& directions) {
+  const bool reads = toolReads(format);
+  const bool writes = toolWrites(format);
+  if (directions.empty()) return reads || writes;
+  switch (directions.front()) {
+    case DexCommonType::IMPORT_ONLY:
+      return reads;
+    case DexCommonType::EXPORT_ONLY:
+      return writes;
+    default:
+      return reads && writes;
+  }
+}
 
 class FormatsCommand final : public Command {
  public:
@@ -283,12 +257,14 @@ class FormatsCommand final : public Command {
   std::string summary() const override { return "list the exchange formats of the registry"; }
   std::string help() const override {
     return "usage: dexchange formats [--import | --export | --both] [--config LIST] [--mode LIST]\n"
-           "                         [--type KIND] [--formats-file PATH] [--json]\n"
+           "                         [--type KIND] [--tool] [--formats-file PATH] [--json]\n"
            "       dexchange formats (--guid GUID | --ext EXTENSION) [--formats-file PATH] [--json]\n"
            "\n"
-           "Lists the formats registry as a table: index, name, direction, extension, data kinds,\n"
-           "units and plug-in libraries. Without a filter every format is listed. With one, the\n"
-           "registry's own queries answer, as for the host's dialogs:\n"
+           "Lists the formats registry as a table: index, name, direction, what the tool reads and\n"
+           "writes with the shipped plug-ins (Tool), extension, data kinds, units and plug-in libraries.\n"
+           "The shipped plug-ins read and write CSV (Comma delimited) and Customizable ASCII Point Files\n"
+           "both ways, although the registry lists each for one direction. Without a filter every format\n"
+           "is listed. With one, the registry's own queries answer, as for the host's dialogs:\n"
            "  --import, --export   formats that can be imported (exported): one-way and two-way formats\n"
            "  --both               two-way formats only\n"
            "  --config LIST        formats offered in every configuration named (REGULAR,ONBOARD,JAPAN)\n"
@@ -297,6 +273,8 @@ class FormatsCommand final : public Command {
            "  --type KIND          formats that carry the data kind (POINTS, LINES, ...); kinds without\n"
            "                       a data-kind row of their own (ROAD_STRINGS, STA_EQUATION_SETS) list\n"
            "                       nothing\n"
+           "  --tool               formats the tool reads or writes; with --import, --export or --both\n"
+           "                       those it reads, writes or both, whatever the registry's direction\n"
            "Without --import, --export or --both a filter accepts formats of any direction.\n"
            "\n"
            "  --guid GUID          shows the first format with the braced GUID\n"
@@ -309,7 +287,7 @@ class FormatsCommand final : public Command {
            "\n"
            "Exit codes: 0 listed, 1 no format with that GUID or extension, 2 wrong command line.\n";
   }
-  std::set<std::string> flags() const override { return {"import", "export", "both", "json"}; }
+  std::set<std::string> flags() const override { return {"import", "export", "both", "tool", "json"}; }
   std::set<std::string> valuedOptions() const override {
     return {"config", "mode", "type", "guid", "ext", "formats-file"};
   }
@@ -378,8 +356,9 @@ class FormatsCommand final : public Command {
         return false;
       }
     }
-    query.filtered =
-        !query.directions.empty() || arguments.has("config") || arguments.has("mode") || query.byType;
+    query.byTool = arguments.has("tool");
+    query.filtered = !query.directions.empty() || arguments.has("config") || arguments.has("mode") ||
+                     query.byType || query.byTool;
     return true;
   }
 
@@ -393,9 +372,10 @@ class FormatsCommand final : public Command {
       return indexes;
     }
     const std::vector<DexCommonType::EDataDirections> directions =
-        query.directions.empty() ? std::vector<DexCommonType::EDataDirections>{DexCommonType::IMPORT_ONLY,
-                                                                               DexCommonType::EXPORT_ONLY}
-                                 : query.directions;
+        query.directions.empty() || query.byTool
+            ? std::vector<DexCommonType::EDataDirections>{DexCommonType::IMPORT_ONLY,
+                                                          DexCommonType::EXPORT_ONLY}
+            : query.directions;
     vyn_vector<int> found;
     for (const DexCommonType::EDataDirections direction : directions) {
       if (query.byType) {
@@ -407,8 +387,11 @@ class FormatsCommand final : public Command {
     }
     std::sort(found.begin(), found.end());
     found.erase(std::unique(found.begin(), found.end()), found.end());
-    for (const int index : found)
-      indexes.push_back(static_cast<unsigned int>(index));
+    for (const int index : found) {
+      const DexFormat& format = *registry.getFormatByIndex(static_cast<unsigned int>(index));
+      if (!query.byTool || toolServes(format, query.directions))
+        indexes.push_back(static_cast<unsigned int>(index));
+    }
     return indexes;
   }
 
@@ -431,7 +414,9 @@ class FormatsCommand final : public Command {
       ++index;
     const FormatView view = viewOf(index, *format);
     if (json) {
-      streams.out << jsonObject(view, "") << '\n';
+      JsonWriter writer;
+      writeJson(writer, view);
+      streams.out << writer.text();
     } else {
       printDetails(streams.out, view);
     }

@@ -1,153 +1,72 @@
-#include <algorithm>
-#include <charconv>
-#include <map>
-
 #include "Command.h"
 #include "ExchangeRun.h"
+#include "RoadsSummary.h"
+#include "RunReport.h"
+#include "ToolText.h"
 #include "ieObjects/IEData.h"
-#include "ieObjects/IEDataDictionary.h"
-#include "ieObjects/IEDataset.h"
-#include "ieObjects/IELayers.h"
-#include "ieObjects/IEPoints.h"
+#include "ieUtils/IEUtilsUnitWords.h"
 
 namespace dexchange_tool {
 namespace {
-
-using vyn::ie::DexObject;
-
-const char* kindName(int kind) {
-  static const char* const kNames[] = {"design points",   "point-to-line points",
-                                       "GNSS raw points", "sheet points",
-                                       "polylines",       "areas",
-                                       "breaklines",      "arcs",
-                                       "surfaces",        "alignments",
-                                       "parcels",         "text labels",
-                                       "circles",         "regions"};
-  return kind >= 0 && kind < static_cast<int>(std::size(kNames)) ? kNames[kind] : "other objects";
-}
-
-std::string fixed3(double value) {
-  char text[64];
-  const auto end = std::to_chars(text, text + sizeof text, value, std::chars_format::fixed, 3).ptr;
-  return std::string(text, end);
-}
-
-// The smallest and largest of the values seen.
-struct Range {
-  double low = 0.0;
-  double high = 0.0;
-  bool any = false;
-  void add(double value) {
-    low = any ? std::min(low, value) : value;
-    high = any ? std::max(high, value) : value;
-    any = true;
-  }
-  std::string text() const { return any ? fixed3(low) + " .. " + fixed3(high) : "-"; }
-};
-
-// What a container holds, counted once.
-struct Summary {
-  std::map<int, int> kinds;
-  std::map<std::string, int> codes;
-  std::map<std::string, int> layers;
-  Range north;
-  Range east;
-  Range height;
-
-  void add(DexObject& object) {
-    ++kinds[object.getType()];
-    for (int c = 0; c < object.getNumberOfCodes(); ++c) {
-      const auto* description = object.getCode(c)->getDescription();
-      if (description != nullptr) ++codes[utf8(description->getName())];
-    }
-    if (object.getLayer() != nullptr) ++layers[utf8(object.getLayer()->getName())];
-    if (const auto* point = dynamic_cast<const vyn::ie::DexDesignPoint*>(&object)) {
-      const vyn::ie::DexStation& station = point->getStation();
-      if (station.isHorizCoordsDefined()) {
-        north.add(station.getX());
-        east.add(station.getY());
-      }
-      if (station.isHeightDefined()) height.add(station.getZ());
-    }
-  }
-};
-
-void printCounts(std::ostream& out, const std::string& title, const std::map<std::string, int>& counts) {
-  out << title << ": " << counts.size() << '\n';
-  for (const auto& [name, count] : counts)
-    out << "  " << name << std::string(name.size() < 20 ? 20 - name.size() : 1, ' ') << count << '\n';
-}
 
 class InfoCommand final : public Command {
  public:
   std::string name() const override { return "info"; }
   std::string summary() const override { return "import a file and show what it holds"; }
   std::string help() const override {
-    return "usage: dexchange info FILE [--from FORMAT] [--types LIST] [--fields LIST] [--delimiter C]\n"
-           "                          [--units UNIT]\n"
+    return "usage: dexchange info FILE [--from FORMAT] [--types LIST] [--fields LIST | --order ORDER]\n"
+           "                          [--delimiter C] [--units UNIT] [--json]\n"
            "\n"
            "Imports FILE through the plug-in of its format (in a worker thread; Ctrl-C stops) and prints\n"
-           "its datasets, objects by kind, codes, layers and coordinate extent. The options are those of\n"
-           "\"dexchange convert\" for the input side.\n"
+           "its datasets, objects by kind, raw observations (records by kind, stations set up, time\n"
+           "range), codes, layers and coordinate extent; for a point file also the columns and the\n"
+           "delimiter it was read by and how many lines were skipped or kept extra values, and for a\n"
+           "file with roads its alignments, their parts and the station-equation sets.\n"
+           "A header line that names the columns decides them; otherwise --fields or --order, otherwise\n"
+           "Name, Northing, Easting, Ht, FullCodes (PNEZD), and a note says so.\n"
+           "\n" +
+           optionsHelp(options()) +
            "\n"
            "Exit codes: 0 shown, 1 the import failed, 2 wrong command line, 130 stopped.\n";
   }
-  std::set<std::string> valuedOptions() const override {
-    return {"from", "types", "fields", "delimiter", "units"};
+  std::vector<Option> options() const override {
+    std::vector<Option> all = inputOptions();
+    all.push_back(jsonOption());
+    return all;
   }
 
   int run(const Arguments& arguments, ToolStreams& streams) const override {
     if (arguments.positional().size() != 1) return fail(streams, kExitUsage, "info: give one FILE");
-    const std::string& path = arguments.positional().front();
+    RunReport report;
+    report.command = "info";
+    report.input.file = arguments.positional().front();
     std::string error;
-    const auto from = FormatChoice::find(arguments.value("from"), path, false, error);
+    const auto from = FormatChoice::find(arguments.value("from"), report.input.file, false, error);
     if (!from) return fail(streams, kExitUsage, "info: " + error);
+    report.input.format = from.get();
     vyn::ie::DexSettings settings;
     if (!makeSettings(arguments, *from->format(), false, settings, error))
       return fail(streams, kExitUsage, "info: " + error);
-    if (!fileExists(path)) return fail(streams, kExitFailure, "info: " + path + " not found");
+    if (!fileExists(report.input.file))
+      return fail(streams, kExitFailure, "info: " + report.input.file + " not found");
 
     vyn::ie::DexParsersLoader loader;
     loader.initIEData(settings);
-    const RunOutcome outcome = runInWorker(loader, false, path, *from->format());
-    printNotes(streams, outcome);
-    if (outcome.result < 0) {
-      return fail(streams, exitCodeOf(outcome.result),
-                  "info: " + failureText(outcome.result, false, path, from->name(), loader));
+    report.data = loader.getIEData();
+    report.units = utf8(vyn::ie::utils::keywordFromDistUnits(settings.distUnits));
+    report.input.finish(runInWorker(loader, false, report.input.file, *from->format()));
+    printNotes(streams, report.input.outcome);
+    const vyn::ie::EDexResult result = report.input.outcome.result;
+    report.exitCode = exitCodeOf(result);
+    if (result < 0)
+      report.error = "info: " + failureText(result, false, report.input.file, from->name(), loader);
+    if (arguments.has("json")) {
+      streams.out << jsonReport(report);
+    } else if (result >= 0) {
+      printInfo(streams.out, report);
+      printRoads(streams.out, *report.data);
     }
-    print(streams.out, path, *from, outcome, *loader.getIEData());
-    return kExitOk;
-  }
-
- private:
-  static void print(std::ostream& out, const std::string& path, const FormatChoice& format,
-                    const RunOutcome& outcome, vyn::ie::DexData& data) {
-    out << "file:     " << path << '\n';
-    out << "format:   " << format.name() << '\n';
-    out << "result:   " << outcome.result
-        << (outcome.result == vyn::ie::DEX_RESULT_OK ? " (ok)" : " (with remarks)") << '\n';
-    out << "datasets: " << data.getNumberOfDatasets() << '\n';
-    Summary all;
-    for (int d = 0; d < data.getNumberOfDatasets(); ++d) {
-      vyn::ie::DexDataset* dataset = data.getDatasetAt(d);
-      Summary own;
-      const int count = dataset->getNumberOfElements(vyn::ie::OBJECT_TYPE_ALL, 2);
-      for (int i = 0; i < count; ++i) {
-        if (DexObject* object = dataset->getObjectAt(i)) {
-          own.add(*object);
-          all.add(*object);
-        }
-      }
-      out << "  \"" << utf8(dataset->getName()) << "\": " << count << " objects\n";
-      for (const auto& [kind, number] : own.kinds)
-        out << "    " << kindName(kind) << ": " << number << '\n';
-    }
-    printCounts(out, "codes", all.codes);
-    printCounts(out, "layers", all.layers);
-    out << "extent:\n";
-    out << "  north   " << all.north.text() << '\n';
-    out << "  east    " << all.east.text() << '\n';
-    out << "  height  " << all.height.text() << '\n';
+    return report.error.empty() ? kExitOk : fail(streams, report.exitCode, report.error);
   }
 };
 
