@@ -128,7 +128,7 @@ CVynStringT<wchar_t> wide(const std::string& path) {
 }
 
 void report(benchmark::State& state, std::int64_t points) {
-  state.SetLabel(vyn_operator_allocator());
+  state.SetLabel(vyn_block_allocator());
   state.SetItemsProcessed(points);
   state.counters["points"] = static_cast<double>(points);
   state.counters["peak_MB"] = peakMegabytes();
@@ -228,7 +228,7 @@ void ModelBlocks(benchmark::State& state) {
     std::vector<void*>& blocks = kept.emplace_back();
     for (int i = 0; i < kPointCount; ++i) {
       for (const std::size_t size : sizes) {
-        void* const block = vyn_operator_new(size);
+        void* const block = vyn_block_new(size);
         if (block != nullptr) std::memset(block, 0, size);
         blocks.push_back(block);
       }
@@ -237,7 +237,7 @@ void ModelBlocks(benchmark::State& state) {
   const double peak = peakMegabytes();
   for (const auto& blocks : kept) {
     for (void* const block : blocks)
-      vyn_operator_delete(block);
+      vyn_block_delete(block);
   }
   report(state, kPointCount * state.iterations());
   state.counters["peak_MB"] = peak;

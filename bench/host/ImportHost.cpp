@@ -61,6 +61,6 @@ int main(int argc, char** argv) {
   }
   std::printf("%.2f s CPU, %.0f MB peak, %d points, %s\n", seconds, dexchange_bench::peakMegabytes(),
               loader.getIEData()->getCurDataset()->getNumberOfElements(OBJECT_TYPE_ALL, 2),
-              vyn_operator_allocator());
+              vyn_block_allocator());
   return 0;
 }

@@ -68,6 +68,11 @@ void* plainAligned(std::size_t size, std::size_t alignment) noexcept {
 
 void* vyn_operator_new(std::size_t size) noexcept {
   if (size > kLargestBlock) return nullptr;
+  return std::malloc(size == 0 ? 1 : size);
+}
+
+void* vyn_block_new(std::size_t size) noexcept {
+  if (size > kLargestBlock) return nullptr;
   if (size == 0) size = 1;
 #ifdef DEXCHANGE_WITH_MIMALLOC
   if (usesMimalloc()) return mi_malloc(size);
@@ -75,7 +80,7 @@ void* vyn_operator_new(std::size_t size) noexcept {
   return std::malloc(size);
 }
 
-void* vyn_operator_new_aligned(std::size_t size, std::size_t alignment) noexcept {
+void* vyn_block_new_aligned(std::size_t size, std::size_t alignment) noexcept {
   if (size > kLargestBlock || !isPowerOfTwo(alignment)) return nullptr;
   if (size == 0) size = 1;
 #ifdef DEXCHANGE_WITH_MIMALLOC
@@ -84,7 +89,7 @@ void* vyn_operator_new_aligned(std::size_t size, std::size_t alignment) noexcept
   return plainAligned(size, alignment);
 }
 
-void vyn_operator_delete(void* block) noexcept {
+void vyn_block_delete(void* block) noexcept {
 #ifdef DEXCHANGE_WITH_MIMALLOC
   if (usesMimalloc()) {
     mi_free(block);
@@ -94,6 +99,6 @@ void vyn_operator_delete(void* block) noexcept {
   std::free(block);
 }
 
-const char* vyn_operator_allocator() noexcept {
+const char* vyn_block_allocator() noexcept {
   return usesMimalloc() ? "mimalloc" : "malloc";
 }

@@ -140,7 +140,7 @@ wchar_t* sharedBlockFor(std::wstring_view text) noexcept {
 wchar_t* allocateBlock(std::size_t capacity) {
   if (capacity > 0x7fffffffU) throw std::bad_alloc();
   const std::size_t bytes = 2 * sizeof(std::uint32_t) + (capacity + 1) * sizeof(wchar_t);
-  auto* block = static_cast<std::uint32_t*>(vyn_operator_new(bytes));
+  auto* block = static_cast<std::uint32_t*>(vyn_block_new(bytes));
   if (block == nullptr) throw std::bad_alloc();
   block[0] = 0;
   block[1] = static_cast<std::uint32_t>(capacity);
@@ -159,7 +159,7 @@ std::size_t String::length() const noexcept {
   return chars_ == nullptr ? 0 : header()->length;
 }
 void String::release() noexcept {
-  if (chars_ != nullptr && header()->capacity > 0) vyn_operator_delete(header());
+  if (chars_ != nullptr && header()->capacity > 0) vyn_block_delete(header());
   chars_ = nullptr;
 }
 void String::setLength(std::size_t newLength) noexcept {

@@ -6,6 +6,7 @@
 #include <algorithm>
 #include <cstddef>
 #include <cstdint>
+#include <cstdlib>
 #include <cstring>
 #include <fstream>
 #include <mutex>
@@ -51,7 +52,7 @@ constexpr std::size_t kSizes[] = {0,    1,     7,     8,      9,      15,     16
 TEST(VynAlloc, BlocksOfEverySizeClassAreOwnAlignedAndWritable) {
   std::vector<Block> blocks;
   for (const std::size_t size : kSizes) {
-    void* const block = vyn_operator_new(size);
+    void* const block = vyn_block_new(size);
     ASSERT_NE(block, nullptr) << size;
     EXPECT_EQ(addressOf(block) % owedAlignment(std::max<std::size_t>(size, 1)), 0U) << size;
     fill(block, size, static_cast<unsigned char>(blocks.size() + 1));
@@ -65,8 +66,8 @@ TEST(VynAlloc, BlocksOfEverySizeClassAreOwnAlignedAndWritable) {
   for (std::size_t i = 1; i < blocks.size(); ++i)
     EXPECT_GE(addressOf(blocks[i].address), addressOf(blocks[i - 1].address) + blocks[i - 1].size);
   for (const Block& block : blocks)
-    vyn_operator_delete(block.address);
-  vyn_operator_delete(nullptr);
+    vyn_block_delete(block.address);
+  vyn_block_delete(nullptr);
 }
 
 TEST(VynAlloc, AlignedBlocksKeepTheirAlignmentAndImpossibleRequestsAnswerNull) {
@@ -87,15 +88,30 @@ TEST(VynAlloc, AlignedBlocksKeepTheirAlignmentAndImpossibleRequestsAnswerNull) {
       {SIZE_MAX, 64, false},
   };
   for (const Case& c : cases) {
-    void* const block = vyn_operator_new_aligned(c.size, c.alignment);
+    void* const block = vyn_block_new_aligned(c.size, c.alignment);
     EXPECT_EQ(block != nullptr, c.served) << c.size << " by " << c.alignment;
     if (block == nullptr) continue;
     EXPECT_EQ(addressOf(block) % c.alignment, 0U) << c.size << " by " << c.alignment;
     fill(block, c.size, 0x5a);
-    vyn_operator_delete(block);
+    vyn_block_delete(block);
   }
-  EXPECT_EQ(vyn_operator_new(kHalfTheAddressSpace), nullptr);
+  EXPECT_EQ(vyn_block_new(kHalfTheAddressSpace), nullptr);
+  EXPECT_EQ(vyn_block_new(SIZE_MAX), nullptr);
+}
+
+// Code that pairs its allocations with free() itself gets blocks of the C library's heap, whichever
+// allocator serves the model.
+TEST(VynAlloc, OperatorNewBlocksGoBackThroughFree) {
+  void* const model = vyn_block_new(64);
+  for (const std::size_t size : kSizes) {
+    void* const block = vyn_operator_new(size);
+    ASSERT_NE(block, nullptr) << size;
+    EXPECT_EQ(addressOf(block) % owedAlignment(std::max<std::size_t>(size, 1)), 0U) << size;
+    fill(block, size, 0x3c);
+    std::free(block);
+  }
   EXPECT_EQ(vyn_operator_new(SIZE_MAX), nullptr);
+  vyn_block_delete(model);
 }
 
 // Model-like classes: a polymorphic pair deleted through the base, and an over-aligned one.
@@ -162,7 +178,7 @@ TEST(VynAlloc, ThreadsReleaseWhatOtherThreadsMade) {
       if (!holds(parcel.block, parcel.size, parcel.seed) ||
           parcel.text->GetLength() != static_cast<int>(parcel.size))
         ++corrupted[thread];
-      vyn_operator_delete(parcel.block);
+      vyn_block_delete(parcel.block);
       delete parcel.text;
     }
   };
@@ -174,7 +190,7 @@ TEST(VynAlloc, ThreadsReleaseWhatOtherThreadsMade) {
       for (int round = 0; round < kRounds; ++round) {
         const std::size_t size = kSizes[(round + thread) % std::size(kSizes)] % 5000;
         const auto seed = static_cast<unsigned char>(round);
-        void* const block = vyn_operator_new(size);
+        void* const block = vyn_block_new(size);
         fill(block, size, seed);
         auto* const text = new CVynStringT<wchar_t>(L'x', static_cast<int>(size));
         {
@@ -219,7 +235,7 @@ TEST(VynAlloc, MemoryFreedByTheHostServesTheNextWorkers) {
     std::thread worker([&model] {
       for (std::size_t i = 0; i < kBlocksPerJob; ++i) {
         const std::size_t size = kJobSizes[i % std::size(kJobSizes)];
-        void* const block = vyn_operator_new(size);
+        void* const block = vyn_block_new(size);
         if (block != nullptr) fill(block, size, 1);
         model.push_back(block);
       }
@@ -227,7 +243,7 @@ TEST(VynAlloc, MemoryFreedByTheHostServesTheNextWorkers) {
     worker.join();
     if (job == 0) afterFirstJob = residentMegabytes();
     for (void* const block : model)
-      vyn_operator_delete(block);
+      vyn_block_delete(block);
     model.clear();
   }
   // Allocators keep some freed memory at hand (mimalloc up to a segment of 32 MiB), never a job's.
@@ -239,10 +255,10 @@ TEST(VynAlloc, MemoryFreedByTheHostServesTheNextWorkers) {
 // and operator new also inside the library's own dependencies, where a program that loads the library
 // with dlopen and has no C++ runtime of its own finds it.
 TEST(VynAlloc, TheProcessKeepsItsOwnMalloc) {
-  EXPECT_TRUE(std::string_view(vyn_operator_allocator()) == "mimalloc" ||
-              std::string_view(vyn_operator_allocator()) == "malloc");
+  EXPECT_TRUE(std::string_view(vyn_block_allocator()) == "mimalloc" ||
+              std::string_view(vyn_block_allocator()) == "malloc");
   Dl_info library{};
-  ASSERT_NE(dladdr(reinterpret_cast<void*>(&vyn_operator_new), &library), 0);
+  ASSERT_NE(dladdr(reinterpret_cast<void*>(&vyn_block_new), &library), 0);
   void* const libraryScope = dlopen(library.dli_fname, RTLD_NOW | RTLD_NOLOAD);
   ASSERT_NE(libraryScope, nullptr);
   const std::pair<void*, std::vector<const char*>> lookups[] = {
