@@ -2,7 +2,8 @@
 // baselines: an fread + splitter + std::from_chars parse of the same file, a std::to_chars write of
 // the same points, and the model's heap blocks allocated with nothing parsed. Run one benchmark per process
 // (bench/point_files.sh does) so that each reports its own peak memory. The file is DEXCHANGE_BENCH_CSV,
-// generated when missing.
+// generated when missing. Each benchmark is labelled with the allocator of the model's blocks
+// (DEXCHANGE_ALLOCATOR=malloc in the environment chooses the C library's malloc).
 
 #include <benchmark/benchmark.h>
 
@@ -18,6 +19,9 @@
 #include <string_view>
 #include <vector>
 
+#include "host/PointFileRun.h"
+#include "hostlibs/VynAlloc.h"
+#include "hostlibs/VynThread.h"
 #include "ieDefinitions/IEFormatsData.h"
 #include "ieObjects/IECodesDataInterface.h"
 #include "ieObjects/IEData.h"
@@ -29,9 +33,10 @@
 namespace {
 
 using namespace vyn::ie;
+using dexchange_bench::csvBothWays;
+using dexchange_bench::peakMegabytes;
 
 constexpr int kPointCount = 1000000;
-constexpr const wchar_t* kCsvId = L"{A9A6A37F-F823-4509-9B41-3AC02B45CAA2}";
 
 std::string benchFile() {
   const char* given = std::getenv("DEXCHANGE_BENCH_CSV");
@@ -65,16 +70,6 @@ const std::string& surveyFile() {
     return file;
   }();
   return path;
-}
-
-// Peak resident memory of the process so far, in MB.
-double peakMegabytes() {
-  std::ifstream status("/proc/self/status");
-  std::string line;
-  while (std::getline(status, line)) {
-    if (line.rfind("VmHWM:", 0) == 0) return std::stod(line.substr(6)) / 1024.0;
-  }
-  return 0.0;
 }
 
 struct BarePoint {
@@ -128,20 +123,12 @@ std::vector<BarePoint> bareParse(const std::string& path, bool keep) {
   return points;
 }
 
-std::unique_ptr<DexFormat> csvBothWays() {
-  const DexFormat& format = *getIEFormatsData().getFormatById(kCsvId);
-  return std::make_unique<DexFormat>(
-      format.getGuid(), format.getName(), DexFormat::IMPORT_AND_EXPORT, L"ExportParsers", L"ImportParsers",
-      format.getTitle(), format.getExtension(false), format.getFilterExtension(), format.getConfigurations(),
-      format.getUsingModes(), format.getDataTypes(), format.getDistanceUnits(), format.getAngleUnits(),
-      format.getParameters());
-}
-
 CVynStringT<wchar_t> wide(const std::string& path) {
   return CVynStringT<wchar_t>(path.c_str(), vyn_text::CP_UTF8);
 }
 
 void report(benchmark::State& state, std::int64_t points) {
+  state.SetLabel(vyn_block_allocator());
   state.SetItemsProcessed(points);
   state.counters["points"] = static_cast<double>(points);
   state.counters["peak_MB"] = peakMegabytes();
@@ -203,15 +190,36 @@ void LoaderImport(benchmark::State& state) {
       state.SkipWithError("import failed");
     points += loader->getIEData()->getCurDataset()->getNumberOfElements(OBJECT_TYPE_ALL, 2);
   }
-  state.counters["peak_MB"] = peakMegabytes();
+  const double peak = peakMegabytes();
   loaders.clear();
-  state.SetItemsProcessed(points);
-  state.counters["points"] = static_cast<double>(points);
+  report(state, points);
+  state.counters["peak_MB"] = peak;
+}
+
+// Jobs of a long-running host: each import runs in a worker thread of its own, and the host's thread
+// frees the container before the next job. The peak after all jobs shows whether the memory of a
+// freed model serves the next one (it stays near one job's peak) or is lost to it.
+void LoaderImportJobs(benchmark::State& state) {
+  const std::string& path = surveyFile();
+  const auto format = csvBothWays();
+  std::int64_t points = 0;
+  for (auto _ : state) {
+    DexParsersLoader loader;
+    loader.initIEData(pointSettings());
+    const HANDLE worker = loader.startImportInSeparateThread(wide(path), format.get(), nullptr);
+    DWORD result = 0;
+    if (worker == INVALID_HANDLE_VALUE || WaitForSingleObject(worker, INFINITE) != WAIT_OBJECT_0 ||
+        !GetExitCodeThread(worker, &result) || static_cast<EDexResult>(result) != DEX_RESULT_OK)
+      state.SkipWithError("import failed");
+    if (worker != INVALID_HANDLE_VALUE) CloseHandle(worker);
+    points += loader.getIEData()->getCurDataset()->getNumberOfElements(OBJECT_TYPE_ALL, 2);
+  }
+  report(state, points);
 }
 
 // The floor of any import into the model on this machine: the heap blocks of a coded point (the point,
-// a seven-character name, one code) allocated and written, with nothing parsed. On virtual machines
-// touching fresh memory is the larger part of it.
+// a seven-character name, one code) allocated from the library's allocator and written, with nothing
+// parsed. On virtual machines touching fresh memory is the larger part of it.
 void ModelBlocks(benchmark::State& state) {
   constexpr std::size_t kNameBlock = 2 * sizeof(std::uint32_t) + 8 * sizeof(wchar_t);
   const std::array<std::size_t, 3> sizes{sizeof(DexDesignPoint), kNameBlock, sizeof(DexCodeValues)};
@@ -220,19 +228,19 @@ void ModelBlocks(benchmark::State& state) {
     std::vector<void*>& blocks = kept.emplace_back();
     for (int i = 0; i < kPointCount; ++i) {
       for (const std::size_t size : sizes) {
-        void* const block = std::malloc(size);
+        void* const block = vyn_block_new(size);
         if (block != nullptr) std::memset(block, 0, size);
         blocks.push_back(block);
       }
     }
   }
-  state.counters["peak_MB"] = peakMegabytes();
+  const double peak = peakMegabytes();
   for (const auto& blocks : kept) {
     for (void* const block : blocks)
-      std::free(block);
+      vyn_block_delete(block);
   }
-  state.SetItemsProcessed(kPointCount * state.iterations());
-  state.counters["points"] = static_cast<double>(kPointCount * state.iterations());
+  report(state, kPointCount * state.iterations());
+  state.counters["peak_MB"] = peak;
 }
 
 void LoaderExport(benchmark::State& state) {
@@ -256,6 +264,7 @@ BENCHMARK(BareParse)->Unit(benchmark::kMillisecond)->Iterations(3);
 BENCHMARK(BareWrite)->Unit(benchmark::kMillisecond)->Iterations(3);
 BENCHMARK(ModelBlocks)->Unit(benchmark::kMillisecond)->Iterations(1);
 BENCHMARK(LoaderImport)->Unit(benchmark::kMillisecond)->Iterations(1);
+BENCHMARK(LoaderImportJobs)->Unit(benchmark::kMillisecond)->Iterations(5)->MeasureProcessCPUTime();
 BENCHMARK(LoaderExport)->Unit(benchmark::kMillisecond)->Iterations(3);
 
 }  // namespace

@@ -39,7 +39,7 @@ measure() {
 echo
 echo "== whole processes"
 echo "dexchange info (import):                   $(measure "$tool" info "$DEXCHANGE_BENCH_DXF")"
-echo "dexchange info, glibc defaults:            $(GLIBC_TUNABLES= measure "$tool" info "$DEXCHANGE_BENCH_DXF")"
+echo "dexchange info, plain malloc:              $(DEXCHANGE_ALLOCATOR=malloc measure "$tool" info "$DEXCHANGE_BENCH_DXF")"
 echo "dexchange convert (import, export):        $(measure "$tool" convert "$DEXCHANGE_BENCH_DXF" "$work/out.dxf" --force)"
 if command -v ogr2ogr >/dev/null 2>&1; then
   echo "ogr2ogr -f Memory (import):                $(measure ogr2ogr -f Memory "$work/memory" "$DEXCHANGE_BENCH_DXF")"

@@ -5,6 +5,7 @@ set -euo pipefail
 packages=(cmake g++ make pkg-config libxml2-dev libxml2-utils googletest libgtest-dev libgmock-dev libbenchmark-dev
   locales gcovr
   python3)  # the tool tests read its JSON reports with Python's json module
+packages+=(libmimalloc-dev)  # the allocator of the model's blocks (src/hostlibs/VynAlloc.cpp)
 # The independent DXF readers and writers the DXF tests compare against (/usr/bin/python3 sees python3-ezdxf).
 packages+=(python3-ezdxf gdal-bin)
 if [[ "${DEXCHANGE_FUZZ:-}" == "ON" ]]; then

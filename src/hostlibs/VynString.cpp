@@ -3,7 +3,6 @@
 #include <algorithm>
 #include <array>
 #include <cstdint>
-#include <cstdlib>
 #include <cwchar>
 #include <cwctype>
 #include <new>
@@ -136,13 +135,12 @@ wchar_t* sharedBlockFor(std::wstring_view text) noexcept {
   return sharedCharacters[static_cast<unsigned char>(ch)].chars;
 }
 
-// A heap block for capacity characters; throws std::bad_alloc like the standard strings. The block is
-// released from its characters (String::release), which the analyzer cannot follow.
-// NOLINTBEGIN(clang-analyzer-unix.Malloc)
+// A block of the host allocator for capacity characters; throws std::bad_alloc like the standard
+// strings. The block is released from its characters (String::release).
 wchar_t* allocateBlock(std::size_t capacity) {
   if (capacity > 0x7fffffffU) throw std::bad_alloc();
   const std::size_t bytes = 2 * sizeof(std::uint32_t) + (capacity + 1) * sizeof(wchar_t);
-  auto* block = static_cast<std::uint32_t*>(std::malloc(bytes));
+  auto* block = static_cast<std::uint32_t*>(vyn_block_new(bytes));
   if (block == nullptr) throw std::bad_alloc();
   block[0] = 0;
   block[1] = static_cast<std::uint32_t>(capacity);
@@ -161,10 +159,9 @@ std::size_t String::length() const noexcept {
   return chars_ == nullptr ? 0 : header()->length;
 }
 void String::release() noexcept {
-  if (chars_ != nullptr && header()->capacity > 0) std::free(header());
+  if (chars_ != nullptr && header()->capacity > 0) vyn_block_delete(header());
   chars_ = nullptr;
 }
-// NOLINTEND(clang-analyzer-unix.Malloc)
 void String::setLength(std::size_t newLength) noexcept {
   if (chars_ == nullptr) return;
   header()->length = static_cast<std::uint32_t>(newLength);
@@ -580,8 +577,19 @@ std::string toUtf8(std::wstring_view text) {
   return detail::toUtf8(text);
 }
 void appendUtf8(std::string& out, std::wstring_view text) {
-  for (const wchar_t ch : text)
-    detail::appendUtf8(out, ch);
+  // The texts of survey files are mostly ASCII: its runs are copied, not encoded one by one.
+  const auto isAscii = [](wchar_t ch) { return ch >= 0 && ch < 0x80; };
+  auto next = text.begin();
+  while (next != text.end()) {
+    const auto asciiEnd = std::find_if_not(next, text.end(), isAscii);
+    const std::size_t start = out.size();
+    out.resize(start + static_cast<std::size_t>(asciiEnd - next));
+    std::transform(next, asciiEnd, out.begin() + static_cast<std::ptrdiff_t>(start),
+                   [](wchar_t ch) { return static_cast<char>(ch); });
+    if (asciiEnd == text.end()) break;
+    detail::appendUtf8(out, *asciiEnd);
+    next = asciiEnd + 1;
+  }
 }
 
 }  // namespace vyn_text

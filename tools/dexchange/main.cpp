@@ -4,10 +4,8 @@
 #include <vector>
 
 #include "Command.h"
-#include "MemoryTuning.h"
 
 int main(int argc, char** argv) {
-  dexchange_tool::restartWithMemoryTuning(argv);
   // The user's locale, as in any host application; the library's number texts do not depend on it.
   std::setlocale(LC_ALL, "");
   const std::vector<std::string> words(argv + 1, argv + argc);
