@@ -1,6 +1,5 @@
 #include "DxfTestModel.h"
 
-#include <cstdio>
 #include <tuple>
 
 #include "dxf/DxfWords.h"
@@ -17,6 +16,7 @@
 #include "ieObjects/IETextLabel.h"
 #include "ieUtils/DrawingPropertiesHelpers.h"
 #include "pointfiles/CodeText.h"
+#include "support/FixedText.h"
 #include "support/TempDir.h"
 
 namespace dxf_test {
@@ -31,9 +31,7 @@ constexpr unsigned long kBlue = 0xFF0000;
 constexpr unsigned long kOrange = 0x0080FF;  // no palette entry: written as a true colour
 
 std::string number(double value) {
-  char text[64];
-  std::snprintf(text, sizeof text, "%.3f", value == 0.0 ? 0.0 : value);
-  return text;
+  return dex_test::fixedText(value == 0.0 ? 0.0 : value, 3);
 }
 
 std::string utf8(const CVynStringT<wchar_t>& text) {

@@ -3,7 +3,6 @@
 // What the GSI plug-in tests share: runs through the loader by format, and the raw records of the
 // current dataset as text to compare.
 
-#include <cstdio>
 #include <memory>
 #include <string>
 #include <vector>
@@ -15,6 +14,7 @@
 #include "ieObjects/IETSRawRecords.h"
 #include "ieUtils/IEParsersLoader.h"
 #include "pointfiles/CodeText.h"
+#include "support/FixedText.h"
 #include "support/TempDir.h"
 
 namespace gsi_test {
@@ -45,9 +45,7 @@ inline EDexResult run(DexParsersLoader& loader, const std::string& path, const w
 
 inline std::string number(double value) {
   if (value == kNoValue) return "-";
-  char text[32];
-  std::snprintf(text, sizeof text, "%.5f", value);
-  return text;
+  return dex_test::fixedText(value, 5);
 }
 
 inline std::string valuesText(const DexTSRawData* values) {
