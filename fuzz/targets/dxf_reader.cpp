@@ -10,7 +10,6 @@
 #include "dxf/DxfExporter.h"
 #include "dxf/DxfImporter.h"
 #include "dxf/DxfWords.h"
-#include "hostlibs/VynLogging.h"
 #include "ieDefinitions/IEFormatsData.h"
 #include "ieObjects/IEData.h"
 #include "ieObjects/IEDataset.h"
@@ -54,11 +53,7 @@ Content contentOf(DexData& data) {
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   static const dex_fuzz::ScratchFile input("dxf-in");
   static const dex_fuzz::ScratchFile drawing("dxf-out");
-  static const bool quiet = [] {
-    vyn_logging::setLogSink([](const vyn_logging::LogRecord&) {});
-    return true;
-  }();
-  (void)quiet;
+  dex_fuzz::silenceLogs();
   dex_fuzz::FuzzInput bytes(data, size);
   const std::uint8_t steering = bytes.takeByte();
   if (!input.write(bytes.takeRest())) return 0;

@@ -7,7 +7,6 @@
 #include <cstdint>
 #include <memory>
 
-#include "hostlibs/VynLogging.h"
 #include "ieDefinitions/IEFormatsData.h"
 #include "ieDefinitions/detail/FormatsDataAccess.h"
 #include "support/FuzzCheck.h"
@@ -98,10 +97,8 @@ void startRegistry(const dex_fuzz::ScratchFile& scratch) {
 }  // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-  // Unknown words and lookups past the end leave error-log records by design: keep them quiet.
-  static const bool quiet = (vyn_logging::setLogSink([](const vyn_logging::LogRecord&) {}), true);
+  dex_fuzz::silenceLogs();
   static const dex_fuzz::ScratchFile scratch("formats-data");
-  (void)quiet;
   dex_fuzz::FuzzInput input(data, size);
   if (!scratch.write(input.takeRest())) return 0;
   readTokens(scratch, size);

@@ -11,7 +11,6 @@
 #include "gsi/GsiExporter.h"
 #include "gsi/GsiImporter.h"
 #include "gsi/GsiWords.h"
-#include "hostlibs/VynLogging.h"
 #include "ieObjects/IEData.h"
 #include "ieObjects/IEDataset.h"
 #include "support/FuzzCheck.h"
@@ -49,11 +48,7 @@ Content contentOf(DexData& data) {
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   static const dex_fuzz::ScratchFile input("gsi-in");
   static const dex_fuzz::ScratchFile output("gsi-out");
-  static const bool quiet = [] {
-    vyn_logging::setLogSink([](const vyn_logging::LogRecord&) {});
-    return true;
-  }();
-  (void)quiet;
+  dex_fuzz::silenceLogs();
   dex_fuzz::FuzzInput bytes(data, size);
   const std::uint8_t steering = bytes.takeByte();
   if (!input.write(bytes.takeRest())) return 0;

@@ -12,7 +12,6 @@
 #include <memory>
 #include <unordered_set>
 
-#include "hostlibs/VynLogging.h"
 #include "ieDefinitions/IEFormatsData.h"
 #include "ieObjects/IEAlignment.h"
 #include "ieObjects/IEData.h"
@@ -134,11 +133,9 @@ bool isImportResult(EDexResult result) {
 }  // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-  // Every malformed part is traced by design: keep the traces quiet.
-  static const bool quiet = (vyn_logging::setLogSink([](const vyn_logging::LogRecord&) {}), true);
+  dex_fuzz::silenceLogs();
   static const dex_fuzz::ScratchFile input("landxml-in");
   static const dex_fuzz::ScratchFile output("landxml-out");
-  (void)quiet;
   DexData::stopProcess_ = false;
   dex_fuzz::FuzzInput bytes(data, size);
   const DexSettings settings = settingsOf(bytes.takeByte());
