@@ -6,6 +6,7 @@
 
 #include "LandXmlWords.h"
 #include "LandXmlWriter.h"
+#include "RepeatedNames.h"
 #include "hostlibs/VynLogging.h"
 #include "ieObjects/IEData.h"
 #include "ieObjects/IEDataset.h"
@@ -198,43 +199,28 @@ bool LandXmlExporter::writeBlock() {
 
 // ---- Names written -------------------------------------------------------------------------------
 
-void WrittenNames::reset(std::size_t expected) {
-  std::size_t capacity = 64;
-  while (capacity < 2 * expected)
-    capacity *= 2;
-  slots_.assign(capacity, Slot{});
-  mask_ = capacity - 1;
-}
-
-bool WrittenNames::insert(std::wstring_view name, const DexDesignPoint* point) {
-  const std::size_t hash = std::hash<std::wstring_view>{}(name);
-  for (std::size_t at = hash & mask_;; at = (at + 1) & mask_) {
-    Slot& slot = slots_[at];
-    if (slot.point == nullptr) {
-      slot = {hash, point};
-      return true;
-    }
-    if (slot.hash == hash && slot.point->getName().view() == name) return false;
-  }
-}
-
 // Writes the next block of the CgPoints being written; true when every point is written. The first
 // CgPoints takes the dataset's points, each further one the points whose names the one before had.
 bool LandXmlExporter::writePoints() {
   const bool fromDataset = pass_ == 0;
   const int count = fromDataset ? objectCount_ : static_cast<int>(pointsLeft_.size());
+  const auto pointAt = [&](int at) -> const DexDesignPoint* {
+    return fromDataset ? dynamic_cast<const DexDesignPoint*>(dataset_->getObjectAt(at))
+                       : pointsLeft_[static_cast<std::size_t>(at)];
+  };
   if (!collectionOpen_) {
     writer_->startCollection("CgPoints");
     collectionOpen_ = true;
-    names_.reset(static_cast<std::size_t>(count));
+    repeatedNames_ = markRepeatedNames(static_cast<std::uint32_t>(count), [&](std::uint32_t at) {
+      const DexDesignPoint* point = pointAt(static_cast<int>(at));
+      return point != nullptr ? point->getName().view() : std::wstring_view();
+    });
   }
   const int end = std::min(count, next_ + kObjectsPerStep);
   for (; next_ < end; ++next_) {
-    const DexDesignPoint* point = fromDataset
-                                      ? dynamic_cast<const DexDesignPoint*>(dataset_->getObjectAt(next_))
-                                      : pointsLeft_[static_cast<std::size_t>(next_)];
+    const DexDesignPoint* point = pointAt(next_);
     if (point == nullptr) continue;
-    if (!point->getName().IsEmpty() && !names_.insert(point->getName().view(), point)) {
+    if (repeatedNames_[static_cast<std::size_t>(next_)]) {
       pointsLater_.push_back(point);
       continue;
     }

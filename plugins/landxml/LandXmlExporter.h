@@ -23,25 +23,6 @@ namespace vyn::ie::landxml {
 
 class LandXmlWriter;
 
-// The names written in one CgPoints (names are unique in one): an open-addressing table of name
-// hashes and points, one probe a name in the common case, so that a million names cost one cache
-// miss each rather than the three of a node-based set.
-class WrittenNames {
- public:
-  // Empties the table for about expected names.
-  void reset(std::size_t expected);
-  // True, and name is entered, when no point of that name was entered before.
-  bool insert(std::wstring_view name, const DexDesignPoint* point);
-
- private:
-  struct Slot {
-    std::size_t hash = 0;
-    const DexDesignPoint* point = nullptr;  // null: free
-  };
-  std::vector<Slot> slots_;
-  std::size_t mask_ = 0;
-};
-
 // Writes the container's current dataset as one LandXML 1.2 document, UTF-8: the LandXML root with
 // Units (the settings' units when LandXML can name them, else meters and decimal degrees) and
 // Application, then the collections the settings ask for:
@@ -108,7 +89,7 @@ class LandXmlExporter final : public DexExporterImpl {
   int pass_ = 0;  // the CgPoints being written: 0 takes the dataset's points, others pointsLeft_
   std::vector<const DexDesignPoint*> pointsLeft_;
   std::vector<const DexDesignPoint*> pointsLater_;
-  WrittenNames names_;
+  std::vector<bool> repeatedNames_;  // of the CgPoints being written: to be written in a later one
   std::unordered_set<const DexObject*> surfaceLines_;  // breaklines written with their surfaces
   std::int64_t notWritten_ = 0;
 };
